@@ -1,0 +1,11 @@
+#include "events/raid_events.h"
+
+#include "events/raid_events_vocabulary.h"
+
+RAIDEvent::RAIDEvent(const char* text, int length, int* consumed) {
+    raid::xml::readElement(*this, text, length, consumed);
+}
+
+RAIDEvents::RAIDEvents(const char* text, int length, int* consumed) {
+    raid::xml::readElement(*this, text, length, consumed);
+}

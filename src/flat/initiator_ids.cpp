@@ -1,0 +1,22 @@
+#include "flat/initiator_ids.h"
+
+#include "flat/accessors.h"
+#include "model/navigation.h"
+
+namespace raid::flat {
+
+void initiatorIDs(char* destination, const std::vector<RAIDAdapter>& list, int position) noexcept {
+    const auto* const adapter = recordAt(list, position);
+    char* end = destination;
+    if (adapter != nullptr) {
+        for (const auto& channel : Navigation::channels(*adapter)) {
+            if (end != destination) {
+                *end++ = ',';
+            }
+            end = writeNumber(end, channel.getInitiatorID());
+        }
+    }
+    *end = '\0';
+}
+
+}  // namespace raid::flat
