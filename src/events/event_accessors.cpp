@@ -2,45 +2,26 @@
 #include "flat/accessors.h"
 #include "flat/lists.h"
 
-using namespace raid::flat;
+namespace {
+
+using Event = RAIDEvent;
+constexpr raid::flat::Family events(RAIDEventList);
+
+}  // namespace
 
 // Unlike the inventory counts, this one never asks the service.
-int getRAIDEventCount() { return static_cast<int>(RAIDEventList.size()); }
+int getRAIDEventCount() { return events.size(); }
 
-int getRAIDEventSequenceNumber(int position) {
-    return number<&RAIDEvent::getSequenceNumber>(RAIDEventList, position);
-}
-int getRAIDEventEventCode(int position) {
-    return number<&RAIDEvent::getEventCode>(RAIDEventList, position);
-}
-int getRAIDEventAdapter(int position) {
-    return number<&RAIDEvent::getAdapter>(RAIDEventList, position);
-}
-int getRAIDEventLogicalDrive(int position) {
-    return number<&RAIDEvent::getLogicalDrive>(RAIDEventList, position);
-}
-int getRAIDEventChannel(int position) {
-    return number<&RAIDEvent::getChannel>(RAIDEventList, position);
-}
-int getRAIDEventDeviceID(int position) {
-    return number<&RAIDEvent::getDeviceID>(RAIDEventList, position);
-}
-int getRAIDEventEnclosureID(int position) {
-    return number<&RAIDEvent::getEnclosureID>(RAIDEventList, position);
-}
+int getRAIDEventSequenceNumber(int at) { return events.number<&Event::getSequenceNumber>(at); }
+int getRAIDEventEventCode(int at) { return events.number<&Event::getEventCode>(at); }
+int getRAIDEventAdapter(int at) { return events.number<&Event::getAdapter>(at); }
+int getRAIDEventLogicalDrive(int at) { return events.number<&Event::getLogicalDrive>(at); }
+int getRAIDEventChannel(int at) { return events.number<&Event::getChannel>(at); }
+int getRAIDEventDeviceID(int at) { return events.number<&Event::getDeviceID>(at); }
+int getRAIDEventEnclosureID(int at) { return events.number<&Event::getEnclosureID>(at); }
 
-void getRAIDEventType(char* destination, int position) {
-    text<"as:type">(destination, RAIDEventList, position);
-}
-void getRAIDEventMessageString(char* destination, int position) {
-    text<"as:string">(destination, RAIDEventList, position);
-}
-void getRAIDEventDate(char* destination, int position) {
-    text<"as:date">(destination, RAIDEventList, position);
-}
-void getRAIDEventServerAddress(char* destination, int position) {
-    text<"as:serverAddress">(destination, RAIDEventList, position);
-}
-void getRAIDEventServerName(char* destination, int position) {
-    text<"as:serverName">(destination, RAIDEventList, position);
-}
+void getRAIDEventType(char* to, int at) { events.text<"as:type">(to, at); }
+void getRAIDEventMessageString(char* to, int at) { events.text<"as:string">(to, at); }
+void getRAIDEventDate(char* to, int at) { events.text<"as:date">(to, at); }
+void getRAIDEventServerAddress(char* to, int at) { events.text<"as:serverAddress">(to, at); }
+void getRAIDEventServerName(char* to, int at) { events.text<"as:serverName">(to, at); }

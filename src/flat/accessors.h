@@ -63,57 +63,69 @@ inline char* writeNumber(char* destination, int value) noexcept {
     return std::to_chars(destination, destination + mostCharacters, value).ptr;
 }
 
+/// The functions of one published list, one member for each shape. A position outside the list
+/// reads nothing.
 template <class Record>
-const Record* recordAt(const std::vector<Record>& list, int position) noexcept {
-    const auto index = static_cast<std::size_t>(position);  // a negative one lies outside, too
-    return index < list.size() ? &list[index] : nullptr;
-}
+class Family {
+public:
+    constexpr explicit Family(const std::vector<Record>& published) noexcept : list(published) {}
 
-template <class Record>
-int count(const std::vector<Record>& list) {
-    if (base::load(refresh) == 1) {
-        getConfig();
+    /// Rebuilds the lists first when a refresh is due.
+    [[nodiscard]] int count() const {
+        if (base::load(refresh) == 1) {
+            getConfig();
+        }
+        return size();
     }
-    return static_cast<int>(list.size());
-}
 
-template <auto Getter, class Record>
-int number(const std::vector<Record>& list, int position) noexcept {
-    const auto* const record = recordAt(list, position);
-    return record == nullptr ? 0 : (record->*Getter)();
-}
+    [[nodiscard]] int size() const noexcept { return static_cast<int>(list.size()); }
 
-/// Text is taken from its member by the element's name: a getter would make a copy first, which
-/// can fail where a C host cannot catch it.
-template <Literal Element, class Record>
-void text(char* destination, const std::vector<Record>& list, int position) noexcept {
-    constexpr auto member = textMember<Record>(Element.view());
-    const auto* const record = recordAt(list, position);
-    write(destination, record == nullptr ? std::string_view() : record->*member);
-}
-
-template <Literal Format, auto Getter, class Record>
-int displayName(char* destination, const std::vector<Record>& list, int position) noexcept {
-    const auto* const record = recordAt(list, position);
-    if (record == nullptr) {
-        write(destination, {});
-        return 0;
+    [[nodiscard]] const Record* at(int position) const noexcept {
+        const auto index = static_cast<std::size_t>(position);  // a negative one lies outside, too
+        return index < list.size() ? &list[index] : nullptr;
     }
-    constexpr auto before = beforeNumber(Format.view());
-    auto* const end = writeNumber(std::ranges::copy(before, destination).out, (record->*Getter)());
-    *end = '\0';
-    return static_cast<int>(end - destination);
-}
 
-/// A status without a word leaves the destination as it was.
-template <class Record>
-void overallStatus(char* destination, const std::vector<Record>& list, int position) noexcept {
-    const auto* const record = recordAt(list, position);
-    const auto status = record == nullptr ? statusWords.size()
-                                          : static_cast<std::size_t>(record->getOverallStatus());
-    if (status < statusWords.size()) {
-        write(destination, statusWords[status]);
+    template <auto Getter>
+    [[nodiscard]] int number(int position) const noexcept {
+        const auto* const record = at(position);
+        return record == nullptr ? 0 : (record->*Getter)();
     }
-}
+
+    /// Text is taken from its member by the element's name: a getter would make a copy first,
+    /// which can fail where a C host cannot catch it.
+    template <Literal Element>
+    void text(char* destination, int position) const noexcept {
+        constexpr auto member = textMember<Record>(Element.view());
+        const auto* const record = at(position);
+        write(destination, record == nullptr ? std::string_view() : record->*member);
+    }
+
+    template <Literal Format, auto Getter>
+    int displayName(char* destination, int position) const noexcept {
+        const auto* const record = at(position);
+        auto* end = destination;
+        if (record != nullptr) {
+            constexpr auto before = beforeNumber(Format.view());
+            end = std::ranges::copy(before, end).out;
+            end = writeNumber(end, (record->*Getter)());
+        }
+        *end = '\0';
+        return static_cast<int>(end - destination);
+    }
+
+    /// A status without a word leaves the destination as it was.
+    void overallStatus(char* destination, int position) const noexcept {
+        const auto* const record = at(position);
+        const auto status = record == nullptr
+                                ? statusWords.size()
+                                : static_cast<std::size_t>(record->getOverallStatus());
+        if (status < statusWords.size()) {
+            write(destination, statusWords[status]);
+        }
+    }
+
+private:
+    const std::vector<Record>& list;
+};
 
 }  // namespace raid::flat

@@ -1,66 +1,55 @@
 #include "flat/accessors.h"
 #include "flat/lists.h"
 
-using namespace raid::flat;
+namespace {
 
-int getArrayCount() { return count(RAIDArrayList); }
+using BasicArray = RAIDBasicArray;
+constexpr raid::flat::Family arrays(RAIDArrayList);
+using SpannedArray = RAIDSpannedArray;
+constexpr raid::flat::Family spannedArrays(SpannedRAIDArrayList);
 
-int getArrayAdapterID(int position) {
-    return number<&RAIDBasicArray::getAdapterID>(RAIDArrayList, position);
-}
-int getArraySpannedArrayIndex(int position) {
-    return number<&RAIDBasicArray::getSpannedArrayIndex>(RAIDArrayList, position);
-}
-int getArraySize(int position) { return number<&RAIDBasicArray::getSize>(RAIDArrayList, position); }
-int getArrayFreeSpace(int position) {
-    return number<&RAIDBasicArray::getFreeSpace>(RAIDArrayList, position);
-}
-int getArrayType(int position) { return number<&RAIDBasicArray::getType>(RAIDArrayList, position); }
-int getArrayArrayID(int position) {
-    return number<&RAIDBasicArray::getArrayID>(RAIDArrayList, position);
-}
-int getArrayStripeSize(int position) {
-    return number<&RAIDBasicArray::getStripeSize>(RAIDArrayList, position);
-}
+}  // namespace
 
-int getArrayAdapterIDString(char* destination, int position) {
-    return displayName<"RAID Adapter %d", &RAIDBasicArray::getAdapterID>(destination, RAIDArrayList,
-                                                                         position);
+int getArrayCount() { return arrays.count(); }
+
+int getArrayAdapterID(int at) { return arrays.number<&BasicArray::getAdapterID>(at); }
+int getArraySpannedArrayIndex(int at) {
+    return arrays.number<&BasicArray::getSpannedArrayIndex>(at);
 }
-int getArrayArrayIDString(char* destination, int position) {
-    return displayName<"RAID Array %d", &RAIDBasicArray::getArrayID>(destination, RAIDArrayList,
-                                                                     position);
+int getArraySize(int at) { return arrays.number<&BasicArray::getSize>(at); }
+int getArrayFreeSpace(int at) { return arrays.number<&BasicArray::getFreeSpace>(at); }
+int getArrayType(int at) { return arrays.number<&BasicArray::getType>(at); }
+int getArrayArrayID(int at) { return arrays.number<&BasicArray::getArrayID>(at); }
+int getArrayStripeSize(int at) { return arrays.number<&BasicArray::getStripeSize>(at); }
+
+int getArrayAdapterIDString(char* to, int at) {
+    return arrays.displayName<"RAID Adapter %d", &BasicArray::getAdapterID>(to, at);
+}
+int getArrayArrayIDString(char* to, int at) {
+    return arrays.displayName<"RAID Array %d", &BasicArray::getArrayID>(to, at);
 }
 
-int getSpannedArrayCount() { return count(SpannedRAIDArrayList); }
+int getSpannedArrayCount() { return spannedArrays.count(); }
 
-int getSpannedArraySpannedArrayIndex(int position) {
-    return number<&RAIDSpannedArray::getSpannedArrayIndex>(SpannedRAIDArrayList, position);
+int getSpannedArraySpannedArrayIndex(int at) {
+    return spannedArrays.number<&SpannedArray::getSpannedArrayIndex>(at);
 }
-int getSpannedArrayAdapterID(int position) {
-    return number<&RAIDSpannedArray::getAdapterID>(SpannedRAIDArrayList, position);
+int getSpannedArrayAdapterID(int at) {
+    return spannedArrays.number<&SpannedArray::getAdapterID>(at);
 }
-int getSpannedArraySize(int position) {
-    return number<&RAIDSpannedArray::getSize>(SpannedRAIDArrayList, position);
+int getSpannedArraySize(int at) { return spannedArrays.number<&SpannedArray::getSize>(at); }
+int getSpannedArrayFreeSpace(int at) {
+    return spannedArrays.number<&SpannedArray::getFreeSpace>(at);
 }
-int getSpannedArrayFreeSpace(int position) {
-    return number<&RAIDSpannedArray::getFreeSpace>(SpannedRAIDArrayList, position);
-}
-int getSpannedArrayType(int position) {
-    return number<&RAIDSpannedArray::getType>(SpannedRAIDArrayList, position);
-}
-int getSpannedArrayArrayID(int position) {
-    return number<&RAIDSpannedArray::getArrayID>(SpannedRAIDArrayList, position);
-}
-int getSpannedArrayStripeSize(int position) {
-    return number<&RAIDSpannedArray::getStripeSize>(SpannedRAIDArrayList, position);
+int getSpannedArrayType(int at) { return spannedArrays.number<&SpannedArray::getType>(at); }
+int getSpannedArrayArrayID(int at) { return spannedArrays.number<&SpannedArray::getArrayID>(at); }
+int getSpannedArrayStripeSize(int at) {
+    return spannedArrays.number<&SpannedArray::getStripeSize>(at);
 }
 
-int getSpannedArrayAdapterIDString(char* destination, int position) {
-    return displayName<"RAID Adapter %d", &RAIDSpannedArray::getAdapterID>(
-        destination, SpannedRAIDArrayList, position);
+int getSpannedArrayAdapterIDString(char* to, int at) {
+    return spannedArrays.displayName<"RAID Adapter %d", &SpannedArray::getAdapterID>(to, at);
 }
-int getSpannedArrayArrayIDString(char* destination, int position) {
-    return displayName<"RAID Array %d", &RAIDSpannedArray::getArrayID>(
-        destination, SpannedRAIDArrayList, position);
+int getSpannedArrayArrayIDString(char* to, int at) {
+    return spannedArrays.displayName<"RAID Array %d", &SpannedArray::getArrayID>(to, at);
 }

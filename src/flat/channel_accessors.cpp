@@ -1,29 +1,24 @@
 #include "flat/accessors.h"
 #include "flat/lists.h"
 
-using namespace raid::flat;
+namespace {
 
-int getChannelCount() { return count(ChannelList); }
+using Channel = RAIDChannel;
+constexpr raid::flat::Family channels(ChannelList);
 
-int getChannelAdapterID(int position) {
-    return number<&RAIDChannel::getAdapterID>(ChannelList, position);
-}
-int getChannelTransferSpeed(int position) {
-    return number<&RAIDChannel::getTransferSpeed>(ChannelList, position);
-}
-int getChannelType(int position) { return number<&RAIDChannel::getType>(ChannelList, position); }
-int getChannelChannelID(int position) {
-    return number<&RAIDChannel::getChannelID>(ChannelList, position);
-}
-int getChannelInitiatorID(int position) {
-    return number<&RAIDChannel::getInitiatorID>(ChannelList, position);
-}
+}  // namespace
 
-int getChannelAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDChannel::getAdapterID>(destination, ChannelList,
-                                                                    position);
+int getChannelCount() { return channels.count(); }
+
+int getChannelAdapterID(int at) { return channels.number<&Channel::getAdapterID>(at); }
+int getChannelTransferSpeed(int at) { return channels.number<&Channel::getTransferSpeed>(at); }
+int getChannelType(int at) { return channels.number<&Channel::getType>(at); }
+int getChannelChannelID(int at) { return channels.number<&Channel::getChannelID>(at); }
+int getChannelInitiatorID(int at) { return channels.number<&Channel::getInitiatorID>(at); }
+
+int getChannelAdapterIDString(char* to, int at) {
+    return channels.displayName<"Controller %d", &Channel::getAdapterID>(to, at);
 }
-int getChannelChannelIDString(char* destination, int position) {
-    return displayName<"SCSI Channel %d", &RAIDChannel::getChannelID>(destination, ChannelList,
-                                                                      position);
+int getChannelChannelIDString(char* to, int at) {
+    return channels.displayName<"SCSI Channel %d", &Channel::getChannelID>(to, at);
 }

@@ -2,73 +2,45 @@
 #include "flat/lists.h"
 #include "model/channels_and_drives_vocabulary.h"
 
-using namespace raid::flat;
+namespace {
 
-int getRAIDDiskDriveCount() { return count(RAIDDiskDriveList); }
+using Drive = RAIDHardDrive;
+constexpr raid::flat::Family drives(RAIDDiskDriveList);
 
-int getRAIDDiskDriveChannelID(int position) {
-    return number<&RAIDHardDrive::getChannelID>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveAdapterID(int position) {
-    return number<&RAIDHardDrive::getAdapterID>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveArrayID(int position) {
-    return number<&RAIDHardDrive::getArrayID>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveArrayUniqueID(int position) {
-    return number<&RAIDHardDrive::getArrayUniqueID>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveHasOSPartition(int position) {
-    return number<&RAIDHardDrive::getHasOSPartition>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveSize(int position) {
-    return number<&RAIDHardDrive::getSize>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveWriteCacheEnable(int position) {
-    return number<&RAIDHardDrive::getWriteCacheEnable>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveWriteCachEnableSupported(int position) {
-    return number<&RAIDHardDrive::getWriteCacheEnableSupported>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveState(int position) {
-    return number<&RAIDHardDrive::getState>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveSmartError(int position) {
-    return number<&RAIDHardDrive::getSmartError>(RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveType(int position) {
-    return number<&RAIDHardDrive::getType>(RAIDDiskDriveList, position);
-}
+}  // namespace
 
-void getRAIDDiskDriveSerialNumber(char* destination, int position) {
-    text<"as:serialNumber">(destination, RAIDDiskDriveList, position);
+int getRAIDDiskDriveCount() { return drives.count(); }
+
+int getRAIDDiskDriveChannelID(int at) { return drives.number<&Drive::getChannelID>(at); }
+int getRAIDDiskDriveAdapterID(int at) { return drives.number<&Drive::getAdapterID>(at); }
+int getRAIDDiskDriveArrayID(int at) { return drives.number<&Drive::getArrayID>(at); }
+int getRAIDDiskDriveArrayUniqueID(int at) { return drives.number<&Drive::getArrayUniqueID>(at); }
+int getRAIDDiskDriveHasOSPartition(int at) { return drives.number<&Drive::getHasOSPartition>(at); }
+int getRAIDDiskDriveSize(int at) { return drives.number<&Drive::getSize>(at); }
+int getRAIDDiskDriveWriteCacheEnable(int at) {
+    return drives.number<&Drive::getWriteCacheEnable>(at);
 }
-void getRAIDDiskDriveModel(char* destination, int position) {
-    text<"as:model">(destination, RAIDDiskDriveList, position);
+int getRAIDDiskDriveWriteCachEnableSupported(int at) {
+    return drives.number<&Drive::getWriteCacheEnableSupported>(at);
 }
-void getRAIDDiskDriveFruNumber(char* destination, int position) {
-    text<"as:fruNumber">(destination, RAIDDiskDriveList, position);
+int getRAIDDiskDriveState(int at) { return drives.number<&Drive::getState>(at); }
+int getRAIDDiskDriveSmartError(int at) { return drives.number<&Drive::getSmartError>(at); }
+int getRAIDDiskDriveType(int at) { return drives.number<&Drive::getType>(at); }
+
+void getRAIDDiskDriveSerialNumber(char* to, int at) { drives.text<"as:serialNumber">(to, at); }
+void getRAIDDiskDriveModel(char* to, int at) { drives.text<"as:model">(to, at); }
+void getRAIDDiskDriveFruNumber(char* to, int at) { drives.text<"as:fruNumber">(to, at); }
+void getRAIDDiskDriveVendor(char* to, int at) { drives.text<"as:vendor">(to, at); }
+void getRAIDDiskDriveFirmwareLevel(char* to, int at) { drives.text<"as:firmwareLevel">(to, at); }
+
+int getRAIDDiskDriveDiskDriveIDString(char* to, int at) {
+    return drives.displayName<"Disk Drive %d", &Drive::getArrayUniqueID>(to, at);
 }
-void getRAIDDiskDriveVendor(char* destination, int position) {
-    text<"as:vendor">(destination, RAIDDiskDriveList, position);
+int getRAIDDiskDriveChannelIDString(char* to, int at) {
+    return drives.displayName<"Channel %d", &Drive::getChannelID>(to, at);
 }
-void getRAIDDiskDriveFirmwareLevel(char* destination, int position) {
-    text<"as:firmwareLevel">(destination, RAIDDiskDriveList, position);
+int getRAIDDiskDriveAdapterIDString(char* to, int at) {
+    return drives.displayName<"Controller %d", &Drive::getAdapterID>(to, at);
 }
 
-int getRAIDDiskDriveDiskDriveIDString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDHardDrive::getArrayUniqueID>(
-        destination, RAIDDiskDriveList, position);
-}
-int getRAIDDiskDriveChannelIDString(char* destination, int position) {
-    return displayName<"Channel %d", &RAIDHardDrive::getChannelID>(destination, RAIDDiskDriveList,
-                                                                   position);
-}
-int getRAIDDiskDriveAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDHardDrive::getAdapterID>(destination,
-                                                                      RAIDDiskDriveList, position);
-}
-
-void getRAIDDiskDriveOverallStatusString(char* destination, int position) {
-    overallStatus(destination, RAIDDiskDriveList, position);
-}
+void getRAIDDiskDriveOverallStatusString(char* to, int at) { drives.overallStatus(to, at); }

@@ -2,64 +2,54 @@
 #include "flat/lists.h"
 #include "model/enclosures_vocabulary.h"
 
-using namespace raid::flat;
+namespace {
 
-int getRAIDEnclosureDeviceCount() { return count(RAIDEnclosureDeviceList); }
+using Enclosure = RAIDEnclosureDevice;
+constexpr raid::flat::Family enclosures(RAIDEnclosureDeviceList);
 
-int getRAIDEnclosureDeviceState(int position) {
-    return number<&RAIDEnclosureDevice::getState>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceArrayID(int position) {
-    return number<&RAIDEnclosureDevice::getArrayID>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceDeviceID(int position) {
-    return number<&RAIDEnclosureDevice::getDeviceID>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceType(int position) {
-    return number<&RAIDEnclosureDevice::getType>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceChannelID(int position) {
-    return number<&RAIDEnclosureDevice::getChannelID>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceLogicalID(int position) {
-    return number<&RAIDEnclosureDevice::getLogicalID>(RAIDEnclosureDeviceList, position);
-}
-int getRAIDEnclosureDeviceAdapterID(int position) {
-    return number<&RAIDEnclosureDevice::getAdapterID>(RAIDEnclosureDeviceList, position);
-}
+}  // namespace
 
-void getRAIDEnclosureDeviceSerialNumber(char* destination, int position) {
-    text<"as:serialNumber">(destination, RAIDEnclosureDeviceList, position);
+int getRAIDEnclosureDeviceCount() { return enclosures.count(); }
+
+int getRAIDEnclosureDeviceState(int at) { return enclosures.number<&Enclosure::getState>(at); }
+int getRAIDEnclosureDeviceArrayID(int at) { return enclosures.number<&Enclosure::getArrayID>(at); }
+int getRAIDEnclosureDeviceDeviceID(int at) {
+    return enclosures.number<&Enclosure::getDeviceID>(at);
 }
-void getRAIDEnclosureDeviceModel(char* destination, int position) {
-    text<"as:model">(destination, RAIDEnclosureDeviceList, position);
+int getRAIDEnclosureDeviceType(int at) { return enclosures.number<&Enclosure::getType>(at); }
+int getRAIDEnclosureDeviceChannelID(int at) {
+    return enclosures.number<&Enclosure::getChannelID>(at);
 }
-void getRAIDEnclosureDeviceFruNumber(char* destination, int position) {
-    text<"as:fruNumber">(destination, RAIDEnclosureDeviceList, position);
+int getRAIDEnclosureDeviceLogicalID(int at) {
+    return enclosures.number<&Enclosure::getLogicalID>(at);
 }
-void getRAIDEnclosureDeviceVendor(char* destination, int position) {
-    text<"as:vendor">(destination, RAIDEnclosureDeviceList, position);
-}
-void getRAIDEnclosureDeviceFirmwareLevel(char* destination, int position) {
-    text<"as:firmwareLevel">(destination, RAIDEnclosureDeviceList, position);
-}
-void getRAIDEnclosureDeviceEnclosureDeviceType(char* destination, int position) {
-    text<"xsi:type">(destination, RAIDEnclosureDeviceList, position);
+int getRAIDEnclosureDeviceAdapterID(int at) {
+    return enclosures.number<&Enclosure::getAdapterID>(at);
 }
 
-int getRAIDEnclosureDeviceEnclosureDeviceIDString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDEnclosureDevice::getDeviceID>(
-        destination, RAIDEnclosureDeviceList, position);
+void getRAIDEnclosureDeviceSerialNumber(char* to, int at) {
+    enclosures.text<"as:serialNumber">(to, at);
 }
-int getRAIDEnclosureDeviceChannelIDString(char* destination, int position) {
-    return displayName<"Channel %d", &RAIDEnclosureDevice::getChannelID>(
-        destination, RAIDEnclosureDeviceList, position);
+void getRAIDEnclosureDeviceModel(char* to, int at) { enclosures.text<"as:model">(to, at); }
+void getRAIDEnclosureDeviceFruNumber(char* to, int at) { enclosures.text<"as:fruNumber">(to, at); }
+void getRAIDEnclosureDeviceVendor(char* to, int at) { enclosures.text<"as:vendor">(to, at); }
+void getRAIDEnclosureDeviceFirmwareLevel(char* to, int at) {
+    enclosures.text<"as:firmwareLevel">(to, at);
 }
-int getRAIDEnclosureDeviceAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDEnclosureDevice::getAdapterID>(
-        destination, RAIDEnclosureDeviceList, position);
+void getRAIDEnclosureDeviceEnclosureDeviceType(char* to, int at) {
+    enclosures.text<"xsi:type">(to, at);
 }
 
-void getRAIDEnclosureDeviceOverallStatusString(char* destination, int position) {
-    overallStatus(destination, RAIDEnclosureDeviceList, position);
+int getRAIDEnclosureDeviceEnclosureDeviceIDString(char* to, int at) {
+    return enclosures.displayName<"Disk Drive %d", &Enclosure::getDeviceID>(to, at);
+}
+int getRAIDEnclosureDeviceChannelIDString(char* to, int at) {
+    return enclosures.displayName<"Channel %d", &Enclosure::getChannelID>(to, at);
+}
+int getRAIDEnclosureDeviceAdapterIDString(char* to, int at) {
+    return enclosures.displayName<"Controller %d", &Enclosure::getAdapterID>(to, at);
+}
+
+void getRAIDEnclosureDeviceOverallStatusString(char* to, int at) {
+    enclosures.overallStatus(to, at);
 }

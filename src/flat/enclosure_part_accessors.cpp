@@ -1,97 +1,80 @@
 #include "flat/accessors.h"
 #include "flat/lists.h"
 
-using namespace raid::flat;
+namespace {
+
+constexpr raid::flat::Family fans(RAIDFanList);
+constexpr raid::flat::Family supplies(RAIDPowerSupplyList);
+constexpr raid::flat::Family sensors(RAIDTempSensorList);
+
+}  // namespace
 
 // The "IDString" of a part carries its enclosure's number, the "StatusString" its status number.
 
-int getRAIDFanCount() { return count(RAIDFanList); }
+int getRAIDFanCount() { return fans.count(); }
 
-int getRAIDFanStatus(int position) { return number<&RAIDFan::getStatus>(RAIDFanList, position); }
-int getRAIDFanEnclosureID(int position) {
-    return number<&RAIDFan::getEnclosureID>(RAIDFanList, position);
-}
-int getRAIDFanChannelID(int position) {
-    return number<&RAIDFan::getChannelID>(RAIDFanList, position);
-}
-int getRAIDFanAdapterID(int position) {
-    return number<&RAIDFan::getAdapterID>(RAIDFanList, position);
-}
+int getRAIDFanStatus(int at) { return fans.number<&RAIDFan::getStatus>(at); }
+int getRAIDFanEnclosureID(int at) { return fans.number<&RAIDFan::getEnclosureID>(at); }
+int getRAIDFanChannelID(int at) { return fans.number<&RAIDFan::getChannelID>(at); }
+int getRAIDFanAdapterID(int at) { return fans.number<&RAIDFan::getAdapterID>(at); }
 
-int getRAIDFanStatusString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDFan::getStatus>(destination, RAIDFanList, position);
+int getRAIDFanStatusString(char* to, int at) {
+    return fans.displayName<"Disk Drive %d", &RAIDFan::getStatus>(to, at);
 }
-int getRAIDFanFanIDString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDFan::getEnclosureID>(destination, RAIDFanList,
-                                                                  position);
+int getRAIDFanFanIDString(char* to, int at) {
+    return fans.displayName<"Disk Drive %d", &RAIDFan::getEnclosureID>(to, at);
 }
-int getRAIDFanChannelIDString(char* destination, int position) {
-    return displayName<"Channel %d", &RAIDFan::getChannelID>(destination, RAIDFanList, position);
+int getRAIDFanChannelIDString(char* to, int at) {
+    return fans.displayName<"Channel %d", &RAIDFan::getChannelID>(to, at);
 }
-int getRAIDFanAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDFan::getAdapterID>(destination, RAIDFanList, position);
+int getRAIDFanAdapterIDString(char* to, int at) {
+    return fans.displayName<"Controller %d", &RAIDFan::getAdapterID>(to, at);
 }
 
-int getRAIDPowerSupplyCount() { return count(RAIDPowerSupplyList); }
+int getRAIDPowerSupplyCount() { return supplies.count(); }
 
-int getRAIDPowerSupplyStatus(int position) {
-    return number<&RAIDPowerSupply::getStatus>(RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyStatus(int at) { return supplies.number<&RAIDPowerSupply::getStatus>(at); }
+int getRAIDPowerSupplyEnclosureID(int at) {
+    return supplies.number<&RAIDPowerSupply::getEnclosureID>(at);
 }
-int getRAIDPowerSupplyEnclosureID(int position) {
-    return number<&RAIDPowerSupply::getEnclosureID>(RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyChannelID(int at) {
+    return supplies.number<&RAIDPowerSupply::getChannelID>(at);
 }
-int getRAIDPowerSupplyChannelID(int position) {
-    return number<&RAIDPowerSupply::getChannelID>(RAIDPowerSupplyList, position);
-}
-int getRAIDPowerSupplyAdapterID(int position) {
-    return number<&RAIDPowerSupply::getAdapterID>(RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyAdapterID(int at) {
+    return supplies.number<&RAIDPowerSupply::getAdapterID>(at);
 }
 
-int getRAIDPowerSupplyStatusString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDPowerSupply::getStatus>(destination,
-                                                                     RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyStatusString(char* to, int at) {
+    return supplies.displayName<"Disk Drive %d", &RAIDPowerSupply::getStatus>(to, at);
 }
-int getRAIDPowerSupplyPowerSupplyIDString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDPowerSupply::getEnclosureID>(
-        destination, RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyPowerSupplyIDString(char* to, int at) {
+    return supplies.displayName<"Disk Drive %d", &RAIDPowerSupply::getEnclosureID>(to, at);
 }
-int getRAIDPowerSupplyChannelIDString(char* destination, int position) {
-    return displayName<"Channel %d", &RAIDPowerSupply::getChannelID>(destination,
-                                                                     RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyChannelIDString(char* to, int at) {
+    return supplies.displayName<"Channel %d", &RAIDPowerSupply::getChannelID>(to, at);
 }
-int getRAIDPowerSupplyAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDPowerSupply::getAdapterID>(
-        destination, RAIDPowerSupplyList, position);
+int getRAIDPowerSupplyAdapterIDString(char* to, int at) {
+    return supplies.displayName<"Controller %d", &RAIDPowerSupply::getAdapterID>(to, at);
 }
 
-int getRAIDTempSensorCount() { return count(RAIDTempSensorList); }
+int getRAIDTempSensorCount() { return sensors.count(); }
 
-int getRAIDTempSensorStatus(int position) {
-    return number<&RAIDTempSensor::getStatus>(RAIDTempSensorList, position);
+int getRAIDTempSensorStatus(int at) { return sensors.number<&RAIDTempSensor::getStatus>(at); }
+int getRAIDTempSensorEnclosureID(int at) {
+    return sensors.number<&RAIDTempSensor::getEnclosureID>(at);
 }
-int getRAIDTempSensorEnclosureID(int position) {
-    return number<&RAIDTempSensor::getEnclosureID>(RAIDTempSensorList, position);
-}
-int getRAIDTempSensorChannelID(int position) {
-    return number<&RAIDTempSensor::getChannelID>(RAIDTempSensorList, position);
-}
-int getRAIDTempSensorAdapterID(int position) {
-    return number<&RAIDTempSensor::getAdapterID>(RAIDTempSensorList, position);
-}
+int getRAIDTempSensorChannelID(int at) { return sensors.number<&RAIDTempSensor::getChannelID>(at); }
+int getRAIDTempSensorAdapterID(int at) { return sensors.number<&RAIDTempSensor::getAdapterID>(at); }
 
-int getRAIDTempSensorStatusString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDTempSensor::getStatus>(destination, RAIDTempSensorList,
-                                                                    position);
+int getRAIDTempSensorStatusString(char* to, int at) {
+    return sensors.displayName<"Disk Drive %d", &RAIDTempSensor::getStatus>(to, at);
 }
-int getRAIDTempSensorTempSensorIDString(char* destination, int position) {
-    return displayName<"Disk Drive %d", &RAIDTempSensor::getEnclosureID>(
-        destination, RAIDTempSensorList, position);
+int getRAIDTempSensorTempSensorIDString(char* to, int at) {
+    return sensors.displayName<"Disk Drive %d", &RAIDTempSensor::getEnclosureID>(to, at);
 }
-int getRAIDTempSensorChannelIDString(char* destination, int position) {
-    return displayName<"Channel %d", &RAIDTempSensor::getChannelID>(destination, RAIDTempSensorList,
-                                                                    position);
+int getRAIDTempSensorChannelIDString(char* to, int at) {
+    return sensors.displayName<"Channel %d", &RAIDTempSensor::getChannelID>(to, at);
 }
-int getRAIDTempSensorAdapterIDString(char* destination, int position) {
-    return displayName<"Controller %d", &RAIDTempSensor::getAdapterID>(
-        destination, RAIDTempSensorList, position);
+int getRAIDTempSensorAdapterIDString(char* to, int at) {
+    return sensors.displayName<"Controller %d", &RAIDTempSensor::getAdapterID>(to, at);
 }

@@ -5,8 +5,7 @@
 
 namespace raid::flat {
 
-void initiatorIDs(char* destination, const std::vector<RAIDAdapter>& list, int position) noexcept {
-    const auto* const adapter = recordAt(list, position);
+void initiatorIDs(char* destination, const RAIDAdapter* adapter) noexcept {
     char* end = destination;
     if (adapter != nullptr) {
         for (const auto& channel : Navigation::channels(*adapter)) {

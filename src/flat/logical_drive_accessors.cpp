@@ -1,60 +1,42 @@
 #include "flat/accessors.h"
 #include "flat/lists.h"
 
-using namespace raid::flat;
+namespace {
 
-int getRAIDLogicalDriveCount() { return count(RAIDLogicalDriveList); }
+using Drive = RAIDLogicalDrive;
+constexpr raid::flat::Family drives(RAIDLogicalDriveList);
 
-int getRAIDLogicalDriveState(int position) {
-    return number<&RAIDLogicalDrive::getState>(RAIDLogicalDriveList, position);
+}  // namespace
+
+int getRAIDLogicalDriveCount() { return drives.count(); }
+
+int getRAIDLogicalDriveState(int at) { return drives.number<&Drive::getState>(at); }
+int getRAIDLogicalDriveShared(int at) { return drives.number<&Drive::getShared>(at); }
+int getRAIDLogicalDriveParitySpace(int at) { return drives.number<&Drive::getParitySpace>(at); }
+int getRAIDLogicalDriveDataSpace(int at) { return drives.number<&Drive::getDataSpace>(at); }
+int getRAIDLogicalDriveArrayID(int at) { return drives.number<&Drive::getArrayID>(at); }
+int getRAIDLogicalDriveAdapterID(int at) { return drives.number<&Drive::getAdapterID>(at); }
+int getRAIDLogicalDriveLogicalDriveID(int at) {
+    return drives.number<&Drive::getLogicalDriveID>(at);
 }
-int getRAIDLogicalDriveShared(int position) {
-    return number<&RAIDLogicalDrive::getShared>(RAIDLogicalDriveList, position);
+int getRAIDLogicalDriveRaidLevel(int at) { return drives.number<&Drive::getRaidLevel>(at); }
+int getRAIDLogicalDriveWriteCacheMode(int at) {
+    return drives.number<&Drive::getWriteCacheMode>(at);
 }
-int getRAIDLogicalDriveParitySpace(int position) {
-    return number<&RAIDLogicalDrive::getParitySpace>(RAIDLogicalDriveList, position);
+int getRAIDLogicalDriveBlocked(int at) { return drives.number<&Drive::getBlocked>(at); }
+int getRAIDLogicalDriveStripeUnitSize(int at) {
+    return drives.number<&Drive::getStripeUnitSize>(at);
 }
-int getRAIDLogicalDriveDataSpace(int position) {
-    return number<&RAIDLogicalDrive::getDataSpace>(RAIDLogicalDriveList, position);
+int getRAIDLogicalDriveType(int at) { return drives.number<&Drive::getType>(at); }
+
+int getRAIDLogicalDriveArrayIDString(char* to, int at) {
+    return drives.displayName<"Logical Drive %d", &Drive::getArrayID>(to, at);
 }
-int getRAIDLogicalDriveArrayID(int position) {
-    return number<&RAIDLogicalDrive::getArrayID>(RAIDLogicalDriveList, position);
+int getRAIDLogicalDriveAdapterIDString(char* to, int at) {
+    return drives.displayName<"Logical Drive %d", &Drive::getAdapterID>(to, at);
 }
-int getRAIDLogicalDriveAdapterID(int position) {
-    return number<&RAIDLogicalDrive::getAdapterID>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveLogicalDriveID(int position) {
-    return number<&RAIDLogicalDrive::getLogicalDriveID>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveRaidLevel(int position) {
-    return number<&RAIDLogicalDrive::getRaidLevel>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveWriteCacheMode(int position) {
-    return number<&RAIDLogicalDrive::getWriteCacheMode>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveBlocked(int position) {
-    return number<&RAIDLogicalDrive::getBlocked>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveStripeUnitSize(int position) {
-    return number<&RAIDLogicalDrive::getStripeUnitSize>(RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveType(int position) {
-    return number<&RAIDLogicalDrive::getType>(RAIDLogicalDriveList, position);
+int getRAIDLogicalDriveLogicalDriveIDString(char* to, int at) {
+    return drives.displayName<"Logical Drive %d", &Drive::getLogicalDriveID>(to, at);
 }
 
-int getRAIDLogicalDriveArrayIDString(char* destination, int position) {
-    return displayName<"Logical Drive %d", &RAIDLogicalDrive::getArrayID>(
-        destination, RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveAdapterIDString(char* destination, int position) {
-    return displayName<"Logical Drive %d", &RAIDLogicalDrive::getAdapterID>(
-        destination, RAIDLogicalDriveList, position);
-}
-int getRAIDLogicalDriveLogicalDriveIDString(char* destination, int position) {
-    return displayName<"Logical Drive %d", &RAIDLogicalDrive::getLogicalDriveID>(
-        destination, RAIDLogicalDriveList, position);
-}
-
-void getRAIDLogicalDriveOverallStatusString(char* destination, int position) {
-    overallStatus(destination, RAIDLogicalDriveList, position);
-}
+void getRAIDLogicalDriveOverallStatusString(char* to, int at) { drives.overallStatus(to, at); }

@@ -3,60 +3,36 @@
 #include "flat/lists.h"
 #include "model/system_and_adapter_vocabulary.h"
 
-using namespace raid::flat;
+namespace {
 
-int getLSIAdapterCount() { return count(LSIAdapterList); }
+using Adapter = RAIDAdapter;
+constexpr raid::flat::Family adapters(LSIAdapterList);
 
-int getLSIAdapterAdapterID(int position) {
-    return number<&RAIDAdapter::getAdapterID>(LSIAdapterList, position);
-}
-int getLSIAdapterPhysicalSlot(int position) {
-    return number<&RAIDAdapter::getPhysicalSlot>(LSIAdapterList, position);
-}
-int getLSIAdapterClustering(int position) {
-    return number<&RAIDAdapter::getClustering>(LSIAdapterList, position);
-}
-int getLSIAdapterBatteryStatus(int position) {
-    return number<&RAIDAdapter::getBatteryStatus>(LSIAdapterList, position);
-}
-int getLSIAdapterHotSwapRebuild(int position) {
-    return number<&RAIDAdapter::getHotSwapRebuild>(LSIAdapterList, position);
-}
+}  // namespace
 
-void getLSIAdapterDriverVersion(char* destination, int position) {
-    text<"as:driverVersion">(destination, LSIAdapterList, position);
+int getLSIAdapterCount() { return adapters.count(); }
+
+int getLSIAdapterAdapterID(int at) { return adapters.number<&Adapter::getAdapterID>(at); }
+int getLSIAdapterPhysicalSlot(int at) { return adapters.number<&Adapter::getPhysicalSlot>(at); }
+int getLSIAdapterClustering(int at) { return adapters.number<&Adapter::getClustering>(at); }
+int getLSIAdapterBatteryStatus(int at) { return adapters.number<&Adapter::getBatteryStatus>(at); }
+int getLSIAdapterHotSwapRebuild(int at) { return adapters.number<&Adapter::getHotSwapRebuild>(at); }
+
+void getLSIAdapterDriverVersion(char* to, int at) { adapters.text<"as:driverVersion">(to, at); }
+void getLSIAdapterBatteryFruNumber(char* to, int at) {
+    adapters.text<"as:batteryFruNumber">(to, at);
 }
-void getLSIAdapterBatteryFruNumber(char* destination, int position) {
-    text<"as:batteryFruNumber">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterFruNumber(char* destination, int position) {
-    text<"as:fruNumber">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterPartNumber(char* destination, int position) {
-    text<"as:partNumber">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterSerialNumber(char* destination, int position) {
-    text<"as:serialNumber">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterTypeName(char* destination, int position) {
-    text<"as:typeName">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterFirmwareVersion(char* destination, int position) {
-    text<"as:firmwareVersion">(destination, LSIAdapterList, position);
-}
-void getLSIAdapterBiosVersion(char* destination, int position) {
-    text<"as:biosVersion">(destination, LSIAdapterList, position);
+void getLSIAdapterFruNumber(char* to, int at) { adapters.text<"as:fruNumber">(to, at); }
+void getLSIAdapterPartNumber(char* to, int at) { adapters.text<"as:partNumber">(to, at); }
+void getLSIAdapterSerialNumber(char* to, int at) { adapters.text<"as:serialNumber">(to, at); }
+void getLSIAdapterTypeName(char* to, int at) { adapters.text<"as:typeName">(to, at); }
+void getLSIAdapterFirmwareVersion(char* to, int at) { adapters.text<"as:firmwareVersion">(to, at); }
+void getLSIAdapterBiosVersion(char* to, int at) { adapters.text<"as:biosVersion">(to, at); }
+
+int getLSIAdapterAdapterIDString(char* to, int at) {
+    return adapters.displayName<"LSI Adapter %d", &Adapter::getAdapterID>(to, at);
 }
 
-int getLSIAdapterAdapterIDString(char* destination, int position) {
-    return displayName<"LSI Adapter %d", &RAIDAdapter::getAdapterID>(destination, LSIAdapterList,
-                                                                     position);
-}
+void getLSIAdapterOverallStatusString(char* to, int at) { adapters.overallStatus(to, at); }
 
-void getLSIAdapterOverallStatusString(char* destination, int position) {
-    overallStatus(destination, LSIAdapterList, position);
-}
-
-void getLSIAdapterInitiatorIDs(char* destination, int position) {
-    initiatorIDs(destination, LSIAdapterList, position);
-}
+void getLSIAdapterInitiatorIDs(char* to, int at) { raid::flat::initiatorIDs(to, adapters.at(at)); }

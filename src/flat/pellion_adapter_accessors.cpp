@@ -3,78 +3,60 @@
 #include "flat/lists.h"
 #include "model/system_and_adapter_vocabulary.h"
 
-using namespace raid::flat;
+namespace {
 
-int getPellionAdapterCount() { return count(PellionAdapterList); }
+using Adapter = RAIDAdapter;
+constexpr raid::flat::Family adapters(PellionAdapterList);
 
-int getPellionAdapterAdapterID(int position) {
-    return number<&RAIDAdapter::getAdapterID>(PellionAdapterList, position);
+}  // namespace
+
+int getPellionAdapterCount() { return adapters.count(); }
+
+int getPellionAdapterAdapterID(int at) { return adapters.number<&Adapter::getAdapterID>(at); }
+int getPellionAdapterPhysicalSlot(int at) { return adapters.number<&Adapter::getPhysicalSlot>(at); }
+int getPellionAdapterClustering(int at) { return adapters.number<&Adapter::getClustering>(at); }
+int getPellionAdapterBatteryStatus(int at) {
+    return adapters.number<&Adapter::getBatteryStatus>(at);
 }
-int getPellionAdapterPhysicalSlot(int position) {
-    return number<&RAIDAdapter::getPhysicalSlot>(PellionAdapterList, position);
+int getPellionAdapterHotSwapRebuild(int at) {
+    return adapters.number<&Adapter::getHotSwapRebuild>(at);
 }
-int getPellionAdapterClustering(int position) {
-    return number<&RAIDAdapter::getClustering>(PellionAdapterList, position);
+int getPellionAdapterStripeUnitSize(int at) {
+    return adapters.number<&Adapter::getStripeUnitSize>(at);
 }
-int getPellionAdapterBatteryStatus(int position) {
-    return number<&RAIDAdapter::getBatteryStatus>(PellionAdapterList, position);
+int getPellionAdapterDataScrubbing(int at) {
+    return adapters.number<&Adapter::getDataScrubbing>(at);
 }
-int getPellionAdapterHotSwapRebuild(int position) {
-    return number<&RAIDAdapter::getHotSwapRebuild>(PellionAdapterList, position);
+int getPellionAdapterAutoSynchronization(int at) {
+    return adapters.number<&Adapter::getAutoSynchronization>(at);
 }
-int getPellionAdapterStripeUnitSize(int position) {
-    return number<&RAIDAdapter::getStripeUnitSize>(PellionAdapterList, position);
-}
-int getPellionAdapterDataScrubbing(int position) {
-    return number<&RAIDAdapter::getDataScrubbing>(PellionAdapterList, position);
-}
-int getPellionAdapterAutoSynchronization(int position) {
-    return number<&RAIDAdapter::getAutoSynchronization>(PellionAdapterList, position);
-}
-int getPellionAdapterUnattended(int position) {
-    return number<&RAIDAdapter::getUnattended>(PellionAdapterList, position);
-}
-int getPellionAdapterLimitedBIOSCompatibility(int position) {
-    return number<&RAIDAdapter::getLimitedBIOSCompatibility>(PellionAdapterList, position);
+int getPellionAdapterUnattended(int at) { return adapters.number<&Adapter::getUnattended>(at); }
+int getPellionAdapterLimitedBIOSCompatibility(int at) {
+    return adapters.number<&Adapter::getLimitedBIOSCompatibility>(at);
 }
 
-void getPellionAdapterDriverVersion(char* destination, int position) {
-    text<"as:driverVersion">(destination, PellionAdapterList, position);
+void getPellionAdapterDriverVersion(char* to, int at) { adapters.text<"as:driverVersion">(to, at); }
+void getPellionAdapterBatteryFruNumber(char* to, int at) {
+    adapters.text<"as:batteryFruNumber">(to, at);
 }
-void getPellionAdapterBatteryFruNumber(char* destination, int position) {
-    text<"as:batteryFruNumber">(destination, PellionAdapterList, position);
+void getPellionAdapterFruNumber(char* to, int at) { adapters.text<"as:fruNumber">(to, at); }
+void getPellionAdapterPartNumber(char* to, int at) { adapters.text<"as:partNumber">(to, at); }
+void getPellionAdapterSerialNumber(char* to, int at) { adapters.text<"as:serialNumber">(to, at); }
+void getPellionAdapterTypeName(char* to, int at) { adapters.text<"as:typeName">(to, at); }
+void getPellionAdapterFirmwareVersion(char* to, int at) {
+    adapters.text<"as:firmwareVersion">(to, at);
 }
-void getPellionAdapterFruNumber(char* destination, int position) {
-    text<"as:fruNumber">(destination, PellionAdapterList, position);
-}
-void getPellionAdapterPartNumber(char* destination, int position) {
-    text<"as:partNumber">(destination, PellionAdapterList, position);
-}
-void getPellionAdapterSerialNumber(char* destination, int position) {
-    text<"as:serialNumber">(destination, PellionAdapterList, position);
-}
-void getPellionAdapterTypeName(char* destination, int position) {
-    text<"as:typeName">(destination, PellionAdapterList, position);
-}
-void getPellionAdapterFirmwareVersion(char* destination, int position) {
-    text<"as:firmwareVersion">(destination, PellionAdapterList, position);
-}
-void getPellionAdapterBiosVersion(char* destination, int position) {
-    text<"as:biosVersion">(destination, PellionAdapterList, position);
+void getPellionAdapterBiosVersion(char* to, int at) { adapters.text<"as:biosVersion">(to, at); }
+
+int getPellionAdapterAdapterIDString(char* to, int at) {
+    return adapters.displayName<"Pellion Adapter %d", &Adapter::getAdapterID>(to, at);
 }
 
-int getPellionAdapterAdapterIDString(char* destination, int position) {
-    return displayName<"Pellion Adapter %d", &RAIDAdapter::getAdapterID>(
-        destination, PellionAdapterList, position);
+void getPellionAdapterOverallStatusString(char* to, int at) { adapters.overallStatus(to, at); }
+
+void getPellionAdapterInitiatorIDs(char* to, int at) {
+    raid::flat::initiatorIDs(to, adapters.at(at));
 }
 
-void getPellionAdapterOverallStatusString(char* destination, int position) {
-    overallStatus(destination, PellionAdapterList, position);
-}
-
-void getPellionAdapterInitiatorIDs(char* destination, int position) {
-    initiatorIDs(destination, PellionAdapterList, position);
-}
-
-// Callers ask without a position; the adapters have one policy.
+// Callers ask without a position; all adapters have this policy.
 int getPellionAdapterCacheReadPolicy() { return 0; }

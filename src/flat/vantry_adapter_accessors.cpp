@@ -3,57 +3,41 @@
 #include "flat/lists.h"
 #include "model/system_and_adapter_vocabulary.h"
 
-using namespace raid::flat;
+namespace {
 
-int getVantryAdapterCount() { return count(VantryAdapterList); }
+using Adapter = RAIDAdapter;
+constexpr raid::flat::Family adapters(VantryAdapterList);
 
-int getVantryAdapterAdapterID(int position) {
-    return number<&RAIDAdapter::getAdapterID>(VantryAdapterList, position);
-}
-int getVantryAdapterPhysicalSlot(int position) {
-    return number<&RAIDAdapter::getPhysicalSlot>(VantryAdapterList, position);
-}
-int getVantryAdapterClustering(int position) {
-    return number<&RAIDAdapter::getClustering>(VantryAdapterList, position);
-}
-int getVantryAdapterBatteryStatus(int position) {
-    return number<&RAIDAdapter::getBatteryStatus>(VantryAdapterList, position);
-}
+}  // namespace
 
-void getVantryAdapterDriverVersion(char* destination, int position) {
-    text<"as:driverVersion">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterBatteryFruNumber(char* destination, int position) {
-    text<"as:batteryFruNumber">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterFruNumber(char* destination, int position) {
-    text<"as:fruNumber">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterPartNumber(char* destination, int position) {
-    text<"as:partNumber">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterSerialNumber(char* destination, int position) {
-    text<"as:serialNumber">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterTypeName(char* destination, int position) {
-    text<"as:typeName">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterFirmwareVersion(char* destination, int position) {
-    text<"as:firmwareVersion">(destination, VantryAdapterList, position);
-}
-void getVantryAdapterBiosVersion(char* destination, int position) {
-    text<"as:biosVersion">(destination, VantryAdapterList, position);
+int getVantryAdapterCount() { return adapters.count(); }
+
+int getVantryAdapterAdapterID(int at) { return adapters.number<&Adapter::getAdapterID>(at); }
+int getVantryAdapterPhysicalSlot(int at) { return adapters.number<&Adapter::getPhysicalSlot>(at); }
+int getVantryAdapterClustering(int at) { return adapters.number<&Adapter::getClustering>(at); }
+int getVantryAdapterBatteryStatus(int at) {
+    return adapters.number<&Adapter::getBatteryStatus>(at);
 }
 
-int getVantryAdapterAdapterIDString(char* destination, int position) {
-    return displayName<"Vantry Adapter %d", &RAIDAdapter::getAdapterID>(
-        destination, VantryAdapterList, position);
+void getVantryAdapterDriverVersion(char* to, int at) { adapters.text<"as:driverVersion">(to, at); }
+void getVantryAdapterBatteryFruNumber(char* to, int at) {
+    adapters.text<"as:batteryFruNumber">(to, at);
+}
+void getVantryAdapterFruNumber(char* to, int at) { adapters.text<"as:fruNumber">(to, at); }
+void getVantryAdapterPartNumber(char* to, int at) { adapters.text<"as:partNumber">(to, at); }
+void getVantryAdapterSerialNumber(char* to, int at) { adapters.text<"as:serialNumber">(to, at); }
+void getVantryAdapterTypeName(char* to, int at) { adapters.text<"as:typeName">(to, at); }
+void getVantryAdapterFirmwareVersion(char* to, int at) {
+    adapters.text<"as:firmwareVersion">(to, at);
+}
+void getVantryAdapterBiosVersion(char* to, int at) { adapters.text<"as:biosVersion">(to, at); }
+
+int getVantryAdapterAdapterIDString(char* to, int at) {
+    return adapters.displayName<"Vantry Adapter %d", &Adapter::getAdapterID>(to, at);
 }
 
-void getVantryAdapterOverallStatusString(char* destination, int position) {
-    overallStatus(destination, VantryAdapterList, position);
-}
+void getVantryAdapterOverallStatusString(char* to, int at) { adapters.overallStatus(to, at); }
 
-void getVantryAdapterInitiatorIDs(char* destination, int position) {
-    initiatorIDs(destination, VantryAdapterList, position);
+void getVantryAdapterInitiatorIDs(char* to, int at) {
+    raid::flat::initiatorIDs(to, adapters.at(at));
 }

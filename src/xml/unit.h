@@ -42,14 +42,19 @@ private:
     Kept& kept;
 };
 
+template <class Sink>
+[[gnu::noinline, gnu::cold]] int readTracedUnit(std::string_view input, int length, Sink& sink) {
+    diag::log(diag::readingLevel, "Enter ParseDefUnit length=%d\n", length);
+    TracingSink tracing(sink);
+    return Scan(input, tracing).run();
+}
+
 /// Reads one unit into the sink and returns the bytes consumed; traced when the log asks for it.
 template <class Sink>
 int readUnit(const char* text, int length, Sink& sink) {
     const std::string_view input(text, static_cast<std::size_t>(std::max(length, 0)));
     if (diag::passes(diag::readingLevel)) {
-        diag::log(diag::readingLevel, "Enter ParseDefUnit length=%d\n", length);
-        TracingSink tracing(sink);
-        return Scan(input, tracing).run();
+        return readTracedUnit(input, length, sink);
     }
     return Scan(input, sink).run();
 }
