@@ -1,0 +1,67 @@
+# shellcheck shell=bash disable=SC2034
+# What the scripts share. Each sources this file first; it takes them to the root of the tree.
+
+root=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
+cd "$root" || exit
+
+jobs=$(nproc)
+buildPackages=(cmake g++ libboost-dev libcli11-dev ninja-build nlohmann-json3-dev)
+testPackages=(g++-multilib googletest pkgconf)
+checkPackages=(clang clang-format clang-tidy shellcheck)
+
+say() { printf '%s\n' "$@"; }
+
+fail() {
+    say "$@" >&2
+    exit 1
+}
+
+# Runs a command with its output in a file, and shows that only when the command fails.
+quietly() {
+    local log=$1
+    shift
+    mkdir -p "$(dirname "$log")"
+    if ! "$@" >"$log" 2>&1 </dev/null; then
+        cat "$log" >&2
+        fail "Failed: $*"
+    fi
+}
+
+isInstalled() {
+    [[ $(dpkg-query --show --showformat='${db:Status-Status}' "$1" 2>/dev/null) == installed ]]
+}
+
+# Installs what is missing of the packages named, or says what that is where it may not.
+requirePackages() {
+    local package missing=() asRoot=()
+    for package in "$@"; do
+        isInstalled "$package" || missing+=("$package")
+    done
+    ((${#missing[@]} > 0)) || return 0
+    if ((EUID != 0)); then
+        if ! sudo -n true 2>/dev/null; then
+            fail "Missing packages: ${missing[*]}" \
+                "Install them with: apt-get install ${missing[*]}"
+        fi
+        asRoot=(sudo -n)
+    fi
+    say "Installing ${missing[*]}"
+    quietly build/apt-update.log "${asRoot[@]}" apt-get update
+    quietly build/apt-install.log "${asRoot[@]}" env DEBIAN_FRONTEND=noninteractive \
+        apt-get install --yes --no-install-recommends "${missing[@]}"
+}
+
+# buildPreset <preset> [<targets>...] [-- <configuration arguments>...]
+buildPreset() {
+    local preset=$1 targets=()
+    shift
+    while (($# > 0)) && [[ $1 != -- ]]; do
+        targets+=("$1")
+        shift
+    done
+    (($# == 0)) || shift
+    ((${#targets[@]} > 0)) || targets=(all)
+    quietly "build/$preset/configure.log" cmake --preset "$preset" "$@"
+    quietly "build/$preset/build.log" \
+        cmake --build --preset "$preset" --parallel "$jobs" --target "${targets[@]}"
+}

@@ -1,0 +1,216 @@
+// Reading "ac:events" and "ac:event".
+
+#include <gtest/gtest.h>
+
+#include <string>
+#include <type_traits>
+#include <variant>
+#include <vector>
+
+#include "events/raid_events.h"
+#include "support/elements.h"
+#include "support/files.h"
+#include "support/fresh_library.h"
+#include "support/row.h"
+#include "xml/raid_xml_error.h"
+
+namespace {
+
+using namespace raid::test;
+
+template <class Model>
+Model read(const std::string& text) {
+    int consumed = 0;
+    Model model(text.data(), static_cast<int>(text.size()), &consumed);
+    EXPECT_EQ(consumed, static_cast<int>(text.size()));
+    return model;
+}
+
+template <class Model>
+std::string errorOf(const std::string& text) {
+    try {
+        int consumed = 0;
+        const Model model(text.data(), static_cast<int>(text.size()), &consumed);
+        return "no error";
+    } catch (const RAIDXMLError& error) {
+        return error.getMessage();
+    }
+}
+
+std::string missing(const std::string& what, const std::string& found) {
+    return "XML syntax error: End of \"" + what + "\" is missing before : " + found +
+           "\nassociation:\n";
+}
+
+class EventReading : public FreshLibrary {};
+
+struct Field : Row {
+    using Number = int (RAIDEvent::*)() const;
+    using Text = std::string (RAIDEvent::*)() const;
+    std::variant<Number, Text> getter;
+};
+
+// Each called after its element.
+const std::vector<Field> fields{
+    {"serverName", &RAIDEvent::getServerName},
+    {"serverAddress", &RAIDEvent::getServerAddress},
+    {"date", &RAIDEvent::getDate},
+    {"string", &RAIDEvent::getMessageString},
+    {"fru", &RAIDEvent::getFru},
+    {"sequenceNumber", &RAIDEvent::getSequenceNumber},
+    {"eventCode", &RAIDEvent::getEventCode},
+    {"type", &RAIDEvent::getType},
+    {"adapter", &RAIDEvent::getAdapter},
+    {"logicalDrive", &RAIDEvent::getLogicalDrive},
+    {"channel", &RAIDEvent::getChannel},
+    {"deviceID", &RAIDEvent::getDeviceID},
+    {"enclosureID", &RAIDEvent::getEnclosureID},
+};
+
+// The field as text, whatever it is.
+std::string valueOf(const RAIDEvent& event, const Field& field) {
+    const auto text = [&](auto getter) -> std::string {
+        if constexpr (std::is_same_v<decltype(getter), Field::Text>) {
+            return (event.*getter)();
+        } else {
+            return std::to_string((event.*getter)());
+        }
+    };
+    return std::visit(text, field.getter);
+}
+
+std::string startValueOf(const Field& field) {
+    return std::holds_alternative<Field::Text>(field.getter) ? "" : "0";
+}
+
+class EventField : public FreshLibrary, public testing::WithParamInterface<Field> {
+protected:
+    static std::string event(std::string_view content) {
+        return element("ac:event", element("as:" + GetParam().name, content));
+    }
+};
+
+TEST_P(EventField, TakesItsElementAndNoOther) {
+    const auto read42 = read<RAIDEvent>(event("42"));
+    for (const Field& field : fields) {
+        EXPECT_EQ(valueOf(read42, field),
+                  field.name == GetParam().name ? "42" : startValueOf(field))
+            << field.name;
+    }
+}
+
+TEST_P(EventField, KeepsItsValueWhenTheElementIsEmptyEitherWay) {
+    const std::string tag = "as:" + GetParam().name;
+    for (const std::string& empty : {element(tag, ""), "<" + tag + "/>"}) {
+        const auto first = element("ac:event", empty);
+        EXPECT_EQ(valueOf(read<RAIDEvent>(first), GetParam()), startValueOf(GetParam()));
+        const auto second = element("ac:event", element(tag, "7") + empty);
+        EXPECT_EQ(valueOf(read<RAIDEvent>(second), GetParam()), "7");
+    }
+}
+
+TEST_P(EventField, IsNamedWhenItsEndTagIsMissing) {
+    const std::string& name = GetParam().name;
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1</ac:event>"),
+              missing(name, "ac:event"));
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1<as:fru>"), missing(name, "as:fru"));
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1"), missing(name, ""));
+}
+
+TEST_P(EventField, IsNamedInTheErrorOfItsStrayEndTag) {
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event></as:" + GetParam().name + "></ac:event>"),
+              missing("Event", "as:" + GetParam().name));
+}
+
+INSTANTIATE_TEST_SUITE_P(Fields, EventField, testing::ValuesIn(fields), nameOfRow);
+
+TEST_F(EventReading, YieldsAnEmptyBatchOfAnEmptyElement) {
+    for (const char* const empty : {"<ac:events></ac:events>", "<ac:events/>"}) {
+        EXPECT_TRUE(read<RAIDEvents>(empty).getEvents().empty());
+    }
+    EXPECT_TRUE(RAIDEvents().getEvents().empty());
+}
+
+TEST_F(EventReading, KeepsTheOrderOfTheDocument) {
+    std::string events;
+    for (const int number : {5, 3, 9, 3}) {
+        events += element("ac:event", element("as:sequenceNumber", number));
+    }
+    std::vector<int> read4;
+    for (const auto& event : read<RAIDEvents>(element("ac:events", events)).getEvents()) {
+        read4.push_back(event.getSequenceNumber());
+    }
+    EXPECT_EQ(read4, (std::vector<int>{5, 3, 9, 3}));
+}
+
+TEST_F(EventReading, KeepsADateAsItWasSent) {
+    for (const char* const date : {"2003-02-30T25:61:00+99:00", "yesterday", "12  May &amp; so"}) {
+        EXPECT_EQ(read<RAIDEvent>(element("ac:event", element("as:date", date))).getDate(), date);
+    }
+}
+
+TEST_F(EventReading, StartsEveryFieldAtZeroOrEmpty) {
+    for (const RAIDEvent& event : {RAIDEvent(), read<RAIDEvent>("<ac:event></ac:event>")}) {
+        for (const Field& field : fields) {
+            EXPECT_EQ(valueOf(event, field), startValueOf(field)) << field.name;
+        }
+        EXPECT_EQ(event.getEventType(), "");
+        event.dump();
+    }
+}
+
+TEST_F(EventReading, TakesTheTypesFromTheAttributes) {
+    const auto events =
+        read<RAIDEvents>(element("ac:events", element("ac:event", "", "o:Event"), "o:Events"));
+    EXPECT_EQ(events.getEventsType(), "o:Events");
+    EXPECT_EQ(events.getEvents().at(0).getEventType(), "o:Event");
+    EXPECT_EQ(read<RAIDEvents>("<ac:events/>").getEventsType(), "");
+    EXPECT_EQ(read<RAIDEvents>("<ac:events xsi:type='a' xsi:type='b' x='c'/>").getEventsType(),
+              "b");
+}
+
+TEST_F(EventReading, HandsOutCopies) {
+    const auto events = read<RAIDEvents>("<ac:events><ac:event/></ac:events>");
+    auto copy = events.getEvents();
+    copy.clear();
+    EXPECT_EQ(events.getEvents().size(), 1U);
+}
+
+TEST_F(EventReading, ReportsWhatDoesNotBelongIntoABatch) {
+    EXPECT_EQ(errorOf<RAIDEvents>("<ac:events></ac:event></ac:events>"),
+              missing("Events", "ac:event"));
+    EXPECT_EQ(errorOf<RAIDEvents>("<ac:events><ac:events>"), missing("name", "ac:events"));
+    EXPECT_EQ(errorOf<RAIDEvents>("<ac:events>"), missing("Events", ""));
+    EXPECT_EQ(errorOf<RAIDEvents>("<ac:events><as:date>"),
+              "XML syntax error: Unknown element in   : as:date\nassociation:\n");
+    EXPECT_EQ(errorOf<RAIDEvents>("<ac:events><ac:event><x>"),
+              "XML syntax error: Unknown element in   : x\nassociation:\n\nassociation:\n");
+}
+
+TEST_F(EventReading, ReportsWhatDoesNotBelongIntoAnEvent) {
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><ac:event>"), missing("name", "ac:event"));
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event>"), missing("Event", ""));
+    for (const char* const unknown : {"as:Date", "ac:events"}) {
+        EXPECT_EQ(errorOf<RAIDEvent>("<ac:event>" + element(unknown, "1") + "</ac:event>"),
+                  "XML syntax error: Unknown element in   : " + std::string(unknown) +
+                      "\nassociation:\n");
+    }
+    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event>some text</ac:event>"),
+              "XML syntax error: Unknown element in   : some text\nassociation:\n");
+}
+
+TEST_F(EventReading, LogsNoExitOfAMalformedElement) {
+    writeLogLevel(9);
+    const auto lines = [](const std::string& document) {
+        errorOf<RAIDEvents>(document);
+        const auto log = readLog();
+        std::filesystem::remove(logPath);
+        return log;
+    };
+    EXPECT_NE(lines("<ac:events/>").find("Exit RAIDEvents Constructor\n"), std::string::npos);
+    const auto failed = lines("<ac:events><ac:event></as:fru>");
+    EXPECT_NE(failed.find("RAIDEvent Constructor\n"), std::string::npos);
+    EXPECT_EQ(failed.find("Exit"), std::string::npos);
+}
+
+}  // namespace

@@ -1,0 +1,31 @@
+#include "support/files.h"
+
+#include <fstream>
+#include <iterator>
+#include <stdexcept>
+
+namespace raid::test {
+
+void writeFile(const std::filesystem::path& path, std::string_view bytes) {
+    std::ofstream file(path, std::ios::binary | std::ios::trunc);
+    file << bytes << std::flush;
+    if (!file) {
+        throw std::runtime_error("cannot write " + path.string());
+    }
+}
+
+std::string readFile(const std::filesystem::path& path) {
+    std::ifstream file(path, std::ios::binary);
+    if (!file) {
+        throw std::runtime_error("cannot read " + path.string());
+    }
+    return {std::istreambuf_iterator<char>(file), {}};
+}
+
+void writeLogLevel(int level) {
+    writeFile(settingsPath, "LogLevel=" + std::to_string(level) + "\n");
+}
+
+std::string readLog() { return std::filesystem::exists(logPath) ? readFile(logPath) : ""; }
+
+}  // namespace raid::test

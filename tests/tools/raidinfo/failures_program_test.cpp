@@ -1,0 +1,112 @@
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <csignal>
+
+#include "documents.h"
+#include "program.h"
+#include "support/scripted_service.h"
+
+namespace raidinfo::test {
+namespace {
+
+using raid::test::answering;
+using raid::test::Connection;
+using raid::test::End;
+using raid::test::newestEventDocument;
+using raid::test::ScriptedService;
+using raid::test::Stage;
+using testing::HasSubstr;
+using testing::MatchesRegex;
+
+// Nothing on standard output, one line that says why on standard error.
+void expectFailure(const Result& result, int status, const std::string& reason) {
+    EXPECT_EQ(result.status, status);
+    EXPECT_EQ(result.output, "");
+    EXPECT_THAT(result.errors, MatchesRegex("raidinfo: [^\n]*\n"));
+    EXPECT_THAT(result.errors, HasSubstr(reason));
+}
+
+TEST(FailingProgram, SaysThatTheServiceDoesNotAnswer) {
+    for (const std::string command : {"list", "tree", "events"}) {
+        expectFailure(run({command, "--json"}), 69, "does not answer");
+    }
+}
+
+TEST(FailingProgram, SaysThatTheServiceClosesWithoutAnAnswer) {
+    const ScriptedService service{{Connection{}, Connection{}}};
+    expectFailure(run({"list"}), 69, "does not answer");
+}
+
+TEST(FailingProgram, SaysThatTheAnswerIsMalformed) {
+    const std::string cut = configuration(sampleAdapter()).substr(0, 900);
+    const ScriptedService service{
+        {answering(cut), answering(newestEventDocument("0")), answering(cut)}};
+    expectFailure(run({"tree", "--json"}), 76, "malformed");
+}
+
+TEST(FailingProgram, SaysThatTheEventsAreMalformed) {
+    const std::string batch = eventBatch({1}).substr(0, 400);
+    const Connection newest = answering(newestEventDocument("1"));
+    const ScriptedService service{
+        {newest, answering(""), answering(batch), newest, answering(""), answering(batch), newest}};
+    expectFailure(run({"events"}), 76, "malformed");
+}
+
+TEST(FailingProgram, GivesUpOnASilentServiceAfterTheTimeout) {
+    const ScriptedService service{{Connection{.end = End::hold}}};
+    expectFailure(run({"list", "--timeout", "1"}), 69, "--timeout");
+}
+
+TEST(FailingProgram, IsInterruptedWhileItWaitsForTheInventory) {
+    const ScriptedService service{{Connection{.end = End::hold}}};
+    Program program{raidinfo({"tree"})};
+    service.waitFor(0, Stage::answered);
+    program.signal(SIGINT);
+    const Result result = program.finish();
+    EXPECT_EQ(result.status, 130);
+    EXPECT_EQ(result.output + result.errors, "");
+}
+
+TEST(FailingProgram, SaysWhyTheLibraryCannotBeLoaded) {
+    expectFailure(run({"list", "--library", "nowhere.so"}), 72, "./nowhere.so");
+}
+
+TEST(FailingProgram, SaysWhatALibraryLacks) {
+    expectFailure(run({"list", "--library", RAID_UNFIT_LIBRARY}), 72, "cancelGetEvent");
+}
+
+TEST(FailingProgram, RefusesAWrongCommandLine) {
+    expectFailure(run({}), 64, "expected one of list, tree, events");
+    expectFailure(run({"lists"}), 64, "--help");
+    expectFailure(run({"list", "--jsn"}), 64, "--jsn");
+}
+
+TEST(FailingProgram, SaysThatItsOutputCannotBeWritten) {
+    const ScriptedService service{{answering(configuration(""))}};
+    expectFailure(
+        Program{{"/bin/sh", "-c", "exec \"$0\" list >/dev/full", RAIDINFO_PROGRAM}}.finish(), 74,
+        "No space left on device");
+}
+
+TEST(FailingProgram, SaysThatItHasNoStandardOutput) {
+    expectFailure(Program{{"/bin/sh", "-c", "exec \"$0\" list >&-", RAIDINFO_PROGRAM}}.finish(), 74,
+                  "cannot write the output");
+}
+
+TEST(Program, LoadsTheLibraryThatItIsTold) {
+    const ScriptedService service{{answering(configuration(""))}};
+    EXPECT_EQ(run({"list", "--library", RAID_LIBRARY}).status, 0);
+}
+
+TEST(Program, PrintsHelpAndVersionOnStandardOutput) {
+    for (const std::string option : {"--help", "--version"}) {
+        const Result result = run({option});
+        EXPECT_EQ(result.status, 0);
+        EXPECT_THAT(result.output, HasSubstr("raidinfo "));
+        EXPECT_EQ(result.errors, "");
+    }
+}
+
+}  // namespace
+}  // namespace raidinfo::test

@@ -1,0 +1,1 @@
+extern "C" int unrelated() { return 0; }

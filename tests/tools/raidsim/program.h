@@ -1,0 +1,42 @@
+#pragma once
+
+#include <sys/types.h>
+
+#include <string>
+#include <vector>
+
+#include "support/socket.h"
+
+namespace raidsim::test {
+
+// The program raidsim as a process of its own, its three streams on pipes.
+class Program {
+public:
+    explicit Program(const std::vector<std::string>& arguments);
+    ~Program();
+    Program(const Program&) = delete;
+    Program& operator=(const Program&) = delete;
+
+    void type(const std::string& text);
+    void endInput() { input.close(); }
+    void signal(int number) const;
+
+    [[nodiscard]] std::string readLine() { return lineOf(output); }
+    [[nodiscard]] std::string readErrorLine() { return lineOf(errors); }
+    // Everything up to the end of the program.
+    [[nodiscard]] std::string readOutput() { return allOf(output); }
+    [[nodiscard]] std::string readErrors() { return allOf(errors); }
+
+    [[nodiscard]] int exitStatus();
+
+private:
+    static std::string lineOf(const raid::test::Socket& stream);
+    static std::string allOf(const raid::test::Socket& stream);
+
+    raid::test::Socket input;
+    raid::test::Socket output;
+    raid::test::Socket errors;
+    pid_t process = -1;
+};
+
+}  // namespace raidsim::test

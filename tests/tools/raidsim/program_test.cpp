@@ -1,0 +1,170 @@
+#include "program.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <csignal>
+#include <string>
+
+#include "client.h"
+#include "running_service.h"
+#include "support/files.h"
+
+namespace raidsim::test {
+namespace {
+
+using raid::test::writeFile;
+using testing::HasSubstr;
+using testing::MatchesRegex;
+using testing::StartsWith;
+
+constexpr std::string_view readiness = "raidsim: listening on 127.0.0.1:";
+
+std::uint16_t portIn(const std::string& line) {
+    EXPECT_THAT(line, StartsWith(std::string(readiness)));
+    return static_cast<std::uint16_t>(std::stoi(line.substr(readiness.size())));
+}
+
+class RunningProgram : public testing::Test {
+protected:
+    RunningProgram() { writeFile("system.xml", smallSystem()); }
+
+    // Starts on a free port with more options.
+    Program& start(const std::vector<std::string>& options = {}) {
+        std::vector<std::string> arguments{"--port", "0", "system.xml"};
+        arguments.insert(arguments.begin(), options.begin(), options.end());
+        program.emplace(arguments);
+        port = portIn(program->readLine());
+        return *program;
+    }
+
+    std::optional<Program> program;
+    std::uint16_t port = 0;
+};
+
+TEST_F(RunningProgram, ListensOnTheServicesPortByDefault) {
+    Program onDefault({"system.xml"});
+    EXPECT_EQ(onDefault.readLine(), "raidsim: listening on 127.0.0.1:34572");
+    EXPECT_THAT(ask(34572, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+    onDefault.type("quit\n");
+    EXPECT_EQ(onDefault.exitStatus(), 0);
+}
+
+TEST_F(RunningProgram, ObeysLinesOnStandardInput) {
+    start().type("event type=Critical\nset drive:0 state=4\nstatus\n");
+    EXPECT_EQ(program->readLine(), "document system.xml, events 1, newest 1, waiting clients 0");
+    EXPECT_THAT(ask(port, getConfig), HasSubstr("<as:state>4</as:state>"));
+    EXPECT_THAT(ask(port, getNewestEvent()), HasSubstr(">1</as:return>"));
+    program->type("quit\n");
+    EXPECT_EQ(program->exitStatus(), 0);
+}
+
+TEST_F(RunningProgram, RefusesBadLinesWithOneLineAndGoesOn) {
+    start().type("reboot\n");
+    EXPECT_EQ(program->readErrorLine(), "raidsim: unknown command \"reboot\"");
+    EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+}
+
+TEST_F(RunningProgram, GoesOnWhenItsInputEnds) {
+    start().type("set system name=elm");
+    program->endInput();
+    program->signal(SIGHUP);
+    EXPECT_EQ(program->readLine(), "serving system.xml");
+    EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+    program->signal(SIGTERM);
+    EXPECT_EQ(program->exitStatus(), 0);
+}
+
+TEST_F(RunningProgram, HangupReloadsOrRefusesWithOneLine) {
+    start();
+    writeFile("system.xml", "<ac:system><as:name>elm</as:name></ac:system>");
+    program->signal(SIGHUP);
+    EXPECT_EQ(program->readLine(), "serving system.xml");
+    EXPECT_THAT(ask(port, getConfig), HasSubstr("<as:name>elm</as:name>"));
+    writeFile("system.xml", "<ac:system>");
+    program->signal(SIGHUP);
+    EXPECT_EQ(program->readErrorLine(),
+              "raidsim: reload: system.xml: line 1: element \"ac:system\" is not closed; "
+              "the old document stays");
+    EXPECT_THAT(ask(port, getConfig), HasSubstr("<as:name>elm</as:name>"));
+}
+
+TEST_F(RunningProgram, InterruptEndsItAlthoughAClientWaits) {
+    start();
+    Client client(port);
+    client.send(waitNextEvent(0));
+    program->signal(SIGINT);
+    EXPECT_EQ(program->exitStatus(), 0);
+}
+
+TEST_F(RunningProgram, PlaysTheScenarioAndTellsTheLineOfAFailingStep) {
+    writeFile("play.scenario",
+              "at 1 event type=Critical\nat 2 set adapter:9 state=4\nat 3 event type=Warning\n");
+    start({"--scenario", "play.scenario", "--speed", "100000"});
+    EXPECT_EQ(program->readErrorLine(),
+              "raidsim: play.scenario: line 2: set: the document has no adapter:9");
+    EXPECT_THAT(ask(port, waitNextEvent(1)), HasSubstr(">2</as:return>"));
+}
+
+TEST_F(RunningProgram, RunsTheInitFileBeforeItListens) {
+    writeFile("before.init", "event type=Information\nevent type=Information\n");
+    start({"--init", "before.init"});
+    EXPECT_THAT(ask(port, getNewestEvent()), HasSubstr(">2</as:return>"));
+}
+
+TEST_F(RunningProgram, PortInUseIsOneLineAndAStatus) {
+    const std::string taken = (start(), std::to_string(port));
+    Program second({"--port", taken, "system.xml"});
+    EXPECT_EQ(second.readErrors(),
+              "raidsim: cannot listen on 127.0.0.1:" + taken + ": Address already in use\n");
+    EXPECT_EQ(second.exitStatus(), 69);
+}
+
+struct FailingStart {
+    std::vector<std::string> arguments;
+    const char* message;
+    int status;
+};
+
+const std::vector<FailingStart> failingStarts{
+
+    {{}, "raidsim: CONFIG is required\n", 64},
+    {{"--color", "system.xml"}, "raidsim: [^\n]*--color[^\n]*\n", 64},
+    {{"--speed", "0", "system.xml"}, "raidsim: --speed: [^\n]*\n", 64},
+    {{"--port", "65536", "system.xml"}, "raidsim: [^\n]*--port[^\n]*\n", 64},
+    {{"gone.xml"}, "raidsim: gone.xml: No such file or directory\n", 66},
+    {{"."}, "raidsim: .: Not a regular file\n", 66},
+    {{"open.xml"}, "raidsim: open.xml: line 1: element \"ac:system\" is not closed\n", 65},
+    {{"--scenario", "gone", "system.xml"}, "raidsim: gone: No such file or directory\n", 66},
+    {{"--scenario", "bad.script", "system.xml"},
+     "raidsim: bad.script: line 1: a step starts with \"at SECONDS\"\n",
+     65},
+    {{"--init", "bad.script", "system.xml"},
+     "raidsim: bad.script: line 2: unknown command \"reboot\"\n",
+     65},
+    {{"--init", "failing.init", "system.xml"},
+     "raidsim: failing.init: line 1: set: the document has no adapter:9\n",
+     65}};
+
+TEST(Program, FailsToStartWithOneLineAndAStatus) {
+    writeFile("system.xml", smallSystem());
+    writeFile("open.xml", "<ac:system>");
+    writeFile("bad.script", "status\nreboot\n");
+    writeFile("failing.init", "set adapter:9 state=4\n");
+    for (const auto& [arguments, message, status] : failingStarts) {
+        Program program(arguments);
+        EXPECT_THAT(program.readErrors(), MatchesRegex(message));
+        EXPECT_EQ(program.exitStatus(), status) << message;
+    }
+}
+
+TEST(Program, HelpNamesEveryOption) {
+    Program program({"--help"});
+    const std::string help = program.readOutput();
+    for (const char* const option : {"CONFIG", "--init", "--scenario", "--speed", "--port"})
+        EXPECT_THAT(help, HasSubstr(option));
+    EXPECT_EQ(program.exitStatus(), 0);
+}
+
+}  // namespace
+}  // namespace raidsim::test

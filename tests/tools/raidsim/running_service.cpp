@@ -1,0 +1,102 @@
+#include "running_service.h"
+
+#include <chrono>
+
+#include "control/command.h"
+
+namespace raidsim::test {
+
+namespace {
+
+ServerSettings onFreePort(ServerSettings settings) {
+    settings.port = 0;
+    return settings;
+}
+
+}  // namespace
+
+std::string smallSystem() {
+    return R"(<ac:system xmlns:ac="a" xmlns:as="b" xmlns:xsi="c" xsi:type="o:System">
+  <as:overallStatus>0</as:overallStatus>
+  <as:name>birch</as:name>
+  <ac:adapter xsi:type="o:PellionAdapter">
+    <as:overallStatus>0</as:overallStatus>
+    <as:adapterID>1</as:adapterID>
+    <ac:arrays>
+      <as:overallStatus>0</as:overallStatus>
+      <ac:basicArray>
+        <as:overallStatus>0</as:overallStatus>
+        <as:arrayID>7</as:arrayID>
+        <ac:physicalDrives>
+          <as:overallStatus>0</as:overallStatus>
+          <ac:channel>
+            <as:overallStatus>0</as:overallStatus>
+            <as:channelID>1</as:channelID>
+            <ac:hardDrive><as:overallStatus>0</as:overallStatus><as:state>1</as:state><as:deviceID>0</as:deviceID></ac:hardDrive>
+          </ac:channel>
+        </ac:physicalDrives>
+      </ac:basicArray>
+    </ac:arrays>
+    <ac:hotSpareDrives>
+      <as:overallStatus>0</as:overallStatus>
+      <ac:hardDrive><as:overallStatus>0</as:overallStatus><as:state>2</as:state><as:deviceID>0</as:deviceID><as:channelID>2</as:channelID></ac:hardDrive>
+    </ac:hotSpareDrives>
+    <ac:physicalDrives>
+      <as:overallStatus>0</as:overallStatus>
+      <ac:channel>
+        <as:overallStatus>0</as:overallStatus>
+        <as:channelID>1</as:channelID>
+        <ac:hardDrive><as:overallStatus>0</as:overallStatus><as:state>1</as:state><as:deviceID>0</as:deviceID><as:channelID>1</as:channelID><as:model>Q</as:model></ac:hardDrive>
+      </ac:channel>
+      <ac:channel>
+        <as:overallStatus>0</as:overallStatus>
+        <as:channelID>2</as:channelID>
+        <ac:hardDrive><as:overallStatus>0</as:overallStatus><as:state>2</as:state><as:deviceID>0</as:deviceID><as:channelID>2</as:channelID><as:model>Q</as:model></ac:hardDrive>
+      </ac:channel>
+    </ac:physicalDrives>
+  </ac:adapter>
+</ac:system>
+)";
+}
+
+Service makeService(const std::string& document, const std::string& path) {
+    return Service(Document::parse(document), path, [] {
+        return std::chrono::system_clock::time_point(std::chrono::seconds(1'000'000'000));
+    });
+}
+
+RunningService::RunningService(ServerSettings settings, const std::string& document)
+    : service(makeService(document)) {
+    server.emplace(context, service, onFreePort(settings));
+    listening = server->port();
+    thread = std::thread([this] { context.run(); });
+}
+
+RunningService::~RunningService() {
+    onService([this] { server->stop(); });
+    thread.join();
+}
+
+void RunningService::command(std::string_view line) {
+    onService([&] { run(line, service); });
+}
+
+std::size_t RunningService::waiting() {
+    return onService([this] { return service.events().waiting(); });
+}
+
+std::size_t RunningService::clients() {
+    return onService([this] { return server->clients(); });
+}
+
+void RunningService::awaitWaiting(std::size_t count) {
+    while (waiting() != count)
+        std::this_thread::yield();
+}
+
+void RunningService::awaitClients(std::size_t count) {
+    while (clients() != count)
+        std::this_thread::yield();
+}
+
+}  // namespace raidsim::test

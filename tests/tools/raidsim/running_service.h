@@ -1,0 +1,57 @@
+#pragma once
+
+#include <boost/asio/io_context.hpp>
+#include <boost/asio/post.hpp>
+#include <future>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <thread>
+
+#include "net/server.h"
+#include "service.h"
+
+namespace raidsim::test {
+
+// A configuration with one adapter of two drives, one of them in an array, the other a spare.
+[[nodiscard]] std::string smallSystem();
+
+// The clock of this service stands still at 2001-09-09T01:46:40Z.
+[[nodiscard]] Service makeService(const std::string& document, const std::string& path = "none");
+
+// A service that answers on a free port from a thread of its own.
+class RunningService {
+public:
+    explicit RunningService(ServerSettings settings = {},
+                            const std::string& document = smallSystem());
+    ~RunningService();
+    RunningService(const RunningService&) = delete;
+    RunningService& operator=(const RunningService&) = delete;
+
+    [[nodiscard]] std::uint16_t port() const noexcept { return listening; }
+
+    // Runs on the service's thread.
+    void command(std::string_view line);
+    [[nodiscard]] std::size_t waiting();
+    [[nodiscard]] std::size_t clients();
+
+    void awaitWaiting(std::size_t count);
+    void awaitClients(std::size_t count);
+
+private:
+    template <typename Action>
+    auto onService(Action action) {
+        std::packaged_task<decltype(action())()> task(std::move(action));
+        auto result = task.get_future();
+        boost::asio::post(context, [&task] { task(); });
+        return result.get();
+    }
+
+    boost::asio::io_context context{1};
+    Service service;
+    std::optional<Server> server;
+    std::uint16_t listening;
+    std::thread thread;
+};
+
+}  // namespace raidsim::test

@@ -1,0 +1,12 @@
+#pragma once
+
+#include <string>
+
+#include "records.h"
+
+namespace raidinfo {
+
+/// An event as one line for people.
+[[nodiscard]] std::string eventLine(const Record& event);
+
+}  // namespace raidinfo

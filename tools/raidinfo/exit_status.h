@@ -1,0 +1,34 @@
+#pragma once
+
+#include <stdexcept>
+#include <string>
+
+namespace raidinfo {
+
+/// What the program's exit status says; the numbers are those of sysexits.h where one fits.
+/// An interrupted program ends with 128 plus the number of the signal.
+enum class ExitStatus : int {
+    ok = 0,
+    usage = 64,
+    serviceUnavailable = 69,
+    internalError = 70,
+    unusableLibrary = 72,
+    outputFailed = 74,
+    malformedAnswer = 76,
+};
+
+constexpr int signalExitBase = 128;
+
+/// Ends the program: one line for standard error and the exit status.
+class Failure : public std::runtime_error {
+public:
+    Failure(ExitStatus status, const std::string& message)
+        : std::runtime_error{message}, reason{status} {}
+
+    [[nodiscard]] ExitStatus status() const noexcept { return reason; }
+
+private:
+    ExitStatus reason;
+};
+
+}  // namespace raidinfo

@@ -1,0 +1,35 @@
+#pragma once
+
+#include <filesystem>
+#include <memory>
+#include <optional>
+
+namespace raidinfo {
+
+/// The loaded libRAIDInstrumentation, unloaded with its last copy. Everything the program knows of
+/// the library goes through the exported names looked up here.
+class Library {
+public:
+    /// Loads `path`; without one the library beside this program, else the installed one.
+    explicit Library(const std::optional<std::filesystem::path>& path);
+
+    /// The exported function `name`, called as `int(int)` and the like. A library without it is
+    /// reported as unusable.
+    template <typename Signature>
+    [[nodiscard]] Signature* function(const char* name) const {
+        return reinterpret_cast<Signature*>(address(name));
+    }
+
+    /// The exported variable `name`.
+    template <typename T>
+    [[nodiscard]] T* variable(const char* name) const {
+        return static_cast<T*>(address(name));
+    }
+
+private:
+    [[nodiscard]] void* address(const char* name) const;
+
+    std::shared_ptr<void> handle;
+};
+
+}  // namespace raidinfo

@@ -1,0 +1,54 @@
+#pragma once
+
+#include <boost/asio/io_context.hpp>
+#include <boost/asio/ip/tcp.hpp>
+#include <boost/asio/steady_timer.hpp>
+#include <chrono>
+#include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <set>
+
+#include "bounds.h"
+#include "service.h"
+
+namespace raidsim {
+
+class Session;
+
+struct ServerSettings {
+    std::uint16_t port = 34572;
+    std::size_t clients = bounds::clients;
+    std::chrono::milliseconds requestTime = bounds::requestTime;
+    std::chrono::milliseconds answerTime = bounds::answerTime;
+    std::chrono::milliseconds drainTime = bounds::drainTime;
+};
+
+// Accepts clients on 127.0.0.1 and gives each a Session. Everything runs on the thread of the
+// io_context, which must outlive the server; so must the service.
+class Server {
+public:
+    // Listens at once; throws boost::system::system_error when it cannot. Port 0 picks one.
+    Server(boost::asio::io_context& context, Service& service, const ServerSettings& settings);
+    ~Server();
+    Server(const Server&) = delete;
+    Server& operator=(const Server&) = delete;
+
+    [[nodiscard]] std::uint16_t port() const;
+    [[nodiscard]] std::size_t clients() const noexcept { return sessions.size(); }
+
+    // Stops listening and drops every client.
+    void stop();
+
+private:
+    void accept();
+    void admit(boost::asio::ip::tcp::socket socket);
+
+    boost::asio::ip::tcp::acceptor acceptor;
+    boost::asio::steady_timer pause;
+    Service& service;
+    ServerSettings settings;
+    std::set<std::shared_ptr<Session>> sessions;
+};
+
+}  // namespace raidsim

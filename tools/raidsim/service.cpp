@@ -1,0 +1,98 @@
+#include "service.h"
+
+#include <array>
+#include <ctime>
+#include <iomanip>
+#include <limits>
+#include <sstream>
+#include <utility>
+
+#include "soap/envelope.h"
+#include "soap/request.h"
+
+namespace raidsim {
+
+namespace {
+
+constexpr std::string_view processor = "/SOAPService/DataProcessor";
+constexpr std::string_view monitor = "/SOAPService/RaidMonitor";
+
+std::string isoDate(std::chrono::system_clock::time_point when) {
+    const std::time_t seconds = std::chrono::system_clock::to_time_t(when);
+    std::tm parts{};
+    gmtime_r(&seconds, &parts);
+    std::ostringstream out;
+    out << std::put_time(&parts, "%Y-%m-%dT%H:%M:%SZ");
+    return out.str();
+}
+
+template <typename... Handlers>
+struct Overloaded : Handlers... {
+    using Handlers::operator()...;
+};
+template <typename... Handlers>
+Overloaded(Handlers...) -> Overloaded<Handlers...>;
+
+Service::Reply replyToCall(const soap::Request& call, const EventLog& log) {
+    using Reply = Service::Reply;
+    return std::visit(Overloaded{
+                          [&](const soap::GetNewestEvent&) -> Reply {
+                              return http::Answer{
+                                  200,
+                                  soap::returnValueBody("m:getNewestEventResponse", log.newest())};
+                          },
+                          [](const soap::WaitNextEvent& wait) -> Reply {
+                              return Service::EventAwaited{wait.lastRetrieved};
+                          },
+                          [&](const soap::GetEvents& range) -> Reply {
+                              return http::Answer{200, log.body(range.start, range.end)};
+                          },
+                      },
+                      call);
+}
+
+}  // namespace
+
+Service::Service(Document initial, std::string path, Clock now)
+    : served(std::move(initial)), file(std::move(path)), clock(std::move(now)) {}
+
+Service::Reply Service::reply(const http::Request& request) const {
+    const bool get = request.method == "GET";
+    const std::string_view target = request.target;
+    if (get && target == std::string(processor) + "?getConfig")
+        return http::Answer{200, served.body()};
+    if (get && target == std::string(monitor) + "?getEvents") {
+        constexpr std::numeric_limits<int> range;
+        return http::Answer{200, log.body(range.min(), range.max())};
+    }
+    if (get || target != monitor)
+        return http::fault({404, "There is no service at this address"});
+    try {
+        return replyToCall(soap::decode(request.body), log);
+    } catch (const soap::RequestError& error) {
+        return http::fault({400, error.what()});
+    }
+}
+
+http::Answer Service::answerToWait(int sequenceNumber) {
+    return {200, soap::returnValueBody("m:waitNextEventResponse", sequenceNumber)};
+}
+
+void Service::reload(const std::string& path) {
+    const std::string& source = path.empty() ? file : path;
+    served = Document::read(source);
+    file = source;
+}
+
+int Service::addEvent(EventLog::Fields fields) {
+    const std::array<std::pair<const char*, std::string>, 3> defaults{{
+        {"date", isoDate(clock())},
+        {"serverName", served.systemName()},
+        {"serverAddress", "127.0.0.1"},
+    }};
+    // In front, so that a given value overrides.
+    fields.insert(fields.begin(), defaults.begin(), defaults.end());
+    return log.append(fields);
+}
+
+}  // namespace raidsim

@@ -1,0 +1,36 @@
+#pragma once
+
+#include <stdexcept>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "state/document.h"
+#include "state/path.h"
+
+// Changes of the document. Each throws EditError, having changed nothing, when the document has
+// no such object or field.
+namespace raidsim {
+
+class EditError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+using Fields = std::vector<std::pair<std::string, std::string>>;
+
+// Writes fields (named without "as:") in every listing that has them. A written overallStatus
+// rises: everything around the object then shows the worst overallStatus that it holds, until
+// it is written itself.
+void setFields(Document& document, const Path& path, const Fields& fields);
+
+// Shows a running task of that many percent in every listing of the object; ends it.
+void setProgress(Document& document, const Path& path, int percent);
+void clearProgress(Document& document, const Path& path);
+
+// Lists a drive in an array (under its channel there) or among the hot spares; takes it out. The
+// overallStatus of what is around rises likewise.
+void join(Document& document, const Path& drive, const Path& collection);
+void leave(Document& document, const Path& drive, const Path& collection);
+
+}  // namespace raidsim
