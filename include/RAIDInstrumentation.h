@@ -41,6 +41,8 @@
  *     calls RAIDinit and the counts and accessors of the inventory one at a time, and an event
  *     thread, which calls getEvent and reads the events between its calls. The lists have no lock.
  *     setRefreshFlag belongs to the inventory thread; cancelGetEvent may be called from any thread.
+ *     A pthread_cancel of a thread that waits in the library takes effect when the wait has ended:
+ *     cancelGetEvent comes first.
  *
  *  6. Refresh. Call RAIDinit once. Afterwards all accessors answer from the lists read then. After
  *     setRefreshFlag the next inventory count of any kind asks the service again and rebuilds all
@@ -572,13 +574,13 @@ int getRAIDFanCount(void);
 /** `as:status` of `ac:fan`; a code of the service. */
 int getRAIDFanStatus(int position);
 
-/** Device ID of the enclosure; 0, see above. */
+/** Always 0, see above (meant for the device ID of the enclosure). */
 int getRAIDFanEnclosureID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDFanChannelID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDFanAdapterID(int position);
 
 /** "Disk Drive %d" with the status number (sic). */
@@ -604,13 +606,13 @@ int getRAIDPowerSupplyCount(void);
 /** `as:status` of `ac:powerSupply`; a code of the service. */
 int getRAIDPowerSupplyStatus(int position);
 
-/** Device ID of the enclosure; 0, see above. */
+/** Always 0, see above (meant for the device ID of the enclosure). */
 int getRAIDPowerSupplyEnclosureID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDPowerSupplyChannelID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDPowerSupplyAdapterID(int position);
 
 /** "Disk Drive %d" with the status number (sic). */
@@ -636,13 +638,13 @@ int getRAIDTempSensorCount(void);
 /** `as:status` of `ac:tempSensor`; a code of the service. */
 int getRAIDTempSensorStatus(int position);
 
-/** Device ID of the enclosure; 0, see above. */
+/** Always 0, see above (meant for the device ID of the enclosure). */
 int getRAIDTempSensorEnclosureID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDTempSensorChannelID(int position);
 
-/** 0, see above. */
+/** Always 0, see above. */
 int getRAIDTempSensorAdapterID(int position);
 
 /** "Disk Drive %d" with the status number (sic). */

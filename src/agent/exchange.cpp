@@ -14,6 +14,7 @@
 #include "agent/first_chunk.h"
 #include "agent/requests.h"
 #include "base/decimal.h"
+#include "base/defer_cancellation.h"
 #include "base/shared_value.h"
 #include "base/stream_socket.h"
 #include "diag/log.h"
@@ -97,6 +98,7 @@ Document receiveBody(const base::StreamSocket& socket, const FirstChunk& chunk) 
 }
 
 Document exchange(const char* request) {
+    const base::DeferCancellation deferred;
     base::store(endFlag, static_cast<unsigned char>(0));
     debug(agentLinkLevel, "RAIDCommunication\n");
 

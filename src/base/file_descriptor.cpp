@@ -2,10 +2,13 @@
 
 #include <unistd.h>
 
+#include "base/defer_cancellation.h"
+
 namespace raid::base {
 
 FileDescriptor::~FileDescriptor() {
     if (descriptor >= 0) {
+        const DeferCancellation deferred;
         ::close(descriptor);
     }
 }

@@ -6,9 +6,12 @@
 
 #include <cerrno>
 
+#include "base/defer_cancellation.h"
+
 namespace raid::base {
 
 std::optional<RegularFile> RegularFile::open(const std::string& path) {
+    const DeferCancellation deferred;
     // O_NONBLOCK matters for a pipe only: its open would otherwise wait for a writer.
     FileDescriptor file(::open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK));
     struct stat status {};
@@ -19,6 +22,7 @@ std::optional<RegularFile> RegularFile::open(const std::string& path) {
 }
 
 std::size_t RegularFile::read(std::span<char> buffer) const noexcept {
+    const DeferCancellation deferred;
     std::size_t filled = 0;
     while (filled < buffer.size()) {
         const auto count = ::read(file.get(), buffer.data() + filled, buffer.size() - filled);

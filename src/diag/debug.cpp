@@ -7,6 +7,7 @@
 #include <memory>
 #include <string>
 
+#include "base/defer_cancellation.h"
 #include "diag/log.h"
 #include "diag/message_format.h"
 
@@ -18,6 +19,7 @@ struct CloseFile {
 
 /// Opened anew for every message, so that the log can be moved or removed under a running host.
 void append(const char* message) {
+    const raid::base::DeferCancellation deferred;
     const std::unique_ptr<std::FILE, CloseFile> log(
         std::fopen("../logs/RAIDInstrumentation.log", "a+e"));
     if (log) {
@@ -36,6 +38,9 @@ void debug(int level, const char* message) {
 namespace raid::diag {
 
 void log(int level, const char* format, ...) {
+    if (!passes(level)) {
+        return;
+    }
     std::array<char, 256> line{};
     std::va_list arguments;
     va_start(arguments, format);

@@ -22,7 +22,8 @@ void readSettings();
     return level <= base::load(LOG_LEVEL);
 }
 
-/// Formats a message of any length, as printf does, and hands it to debug.
+/// Formats a message of any length, as printf does, and hands it to debug; does neither below the
+/// level.
 [[gnu::format(printf, 2, 3)]] void log(int level, const char* format, ...);
 
 }  // namespace raid::diag

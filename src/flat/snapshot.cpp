@@ -10,8 +10,8 @@
 #include "agent/agent_link.h"
 #include "base/shared_value.h"
 #include "flat/lists.h"
-#include "model/array_members.h"
 #include "model/navigation.h"
+#include "model/numbering.h"
 
 unsigned char refresh = 0;
 unsigned char initialized = 0;

@@ -27,12 +27,13 @@ bool isSetting(std::string_view line) {
 
 std::string readWhole(const std::string& name) {
     const auto file = raid::base::RegularFile::open(name);
-    if (!file || file->size() > PropertyFile::sizeLimit) {
-        throw std::runtime_error("cannot read " + name);
+    if (file && file->size() <= PropertyFile::sizeLimit) {
+        std::string text(static_cast<std::size_t>(file->size()), '\0');
+        if (file->read(text) == text.size()) {
+            return text;
+        }
     }
-    std::string text(static_cast<std::size_t>(file->size()), '\0');
-    text.resize(file->read(text));
-    return text;
+    throw std::runtime_error("cannot read " + name);
 }
 
 }  // namespace

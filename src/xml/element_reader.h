@@ -99,7 +99,7 @@ void passOver(UnitReader& units) {
         if (unit.isUnfinished()) {
             throwMissingEnd(words.endWord, unit);
         }
-        if (unit.isTag && unit.closing && unit.name == words.element) {
+        if (unit.isTag && unit.closing && !unit.opening && unit.name == words.element) {
             return;
         }
     }
@@ -137,11 +137,11 @@ void readChildren(Model& model, UnitReader& units) {
 template <class Model>
 void readContent(Model& model, UnitReader& units, const Unit& start) {
     constexpr auto& words = Vocabulary<Model>::words;
-    if (!start.isTag || !start.opening || start.name != words.element) {
-        throwUnknown(start);
-    }
     if (start.isUnfinished()) {
         throwMissingEnd(words.endWord, start);
+    }
+    if (!start.isTag || !start.opening || start.name != words.element) {
+        throwUnknown(start);
     }
     model.*Vocabulary<Model>::type = start.type;
     if (start.closing) {

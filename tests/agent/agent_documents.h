@@ -27,8 +27,8 @@ inline int process(int (*processor)(char*, int), std::string_view document) {
 
 [[nodiscard]] inline std::string eventsNumbered(int first, int count) {
     std::string events;
-    for (int number = first; number < first + count; ++number) {
-        events += element("ac:event", element("as:sequenceNumber", number));
+    for (int at = 0; at < count; ++at) {
+        events += element("ac:event", element("as:sequenceNumber", first + at));
     }
     return eventsDocument(element("ac:events", events));
 }

@@ -56,10 +56,10 @@ TEST(CancellableRun, InterruptsTheSystemCallThatTheWorkWaitsIn) {
     int error = 0;
     const Ending ending = CancellableRun{}.run(
         [&](const std::stop_token& stop) {
-            while (!stop.stop_requested()) {
+            do {
                 result = poll(nullptr, 0, -1);
                 error = errno;
-            }
+            } while (!stop.stop_requested());
         },
         [] {}, soon);
     EXPECT_TRUE(ending.timedOut);
