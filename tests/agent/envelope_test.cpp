@@ -49,7 +49,7 @@ const std::vector<Rejected> rejected{
     {"OfTheEventsResponse", eventsNumbered(1, 2), ""},
     {"CutInTheEnvelope", good.substr(0, good.find("<env:Body") + 4), ""},
     {"CutBehindTheResponse", good.substr(0, good.find("<ac:system")),
-     "XML syntax error: Unknown element in   : \nsystem:\n"},
+     "XML syntax error: End of \"system\" is missing before : \nsystem:\n"},
     {"CutInThePayload", good.substr(0, good.find("</ac:system")),
      "XML syntax error: End of \"system\" is missing before : \nsystem:host\n"},
     {"OfAnEmptyResponse", configDocument(""),
