@@ -16,7 +16,7 @@ constexpr std::string_view lengthLetters = "hlLqjzt";
 constexpr std::string_view integerLetters = "diouxX";
 constexpr std::string_view floatingLetters = "aAeEfFgG";
 
-/// One conversion specification, taken apart. Its letter is NUL when the message ends first.
+/// One conversion of a format, taken apart. Its letter is NUL when the message ends first.
 struct Conversion {
     std::string_view text;  // from its "%" to its letter
     std::string_view flags;

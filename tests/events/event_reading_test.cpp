@@ -11,31 +11,12 @@
 #include "support/elements.h"
 #include "support/files.h"
 #include "support/fresh_library.h"
+#include "support/reading.h"
 #include "support/row.h"
-#include "xml/raid_xml_error.h"
 
 namespace {
 
 using namespace raid::test;
-
-template <class Model>
-Model read(const std::string& text) {
-    int consumed = 0;
-    Model model(text.data(), static_cast<int>(text.size()), &consumed);
-    EXPECT_EQ(consumed, static_cast<int>(text.size()));
-    return model;
-}
-
-template <class Model>
-std::string errorOf(const std::string& text) {
-    try {
-        int consumed = 0;
-        const Model model(text.data(), static_cast<int>(text.size()), &consumed);
-        return "no error";
-    } catch (const RAIDXMLError& error) {
-        return error.getMessage();
-    }
-}
 
 std::string missing(const std::string& what, const std::string& found) {
     return "XML syntax error: End of \"" + what + "\" is missing before : " + found +

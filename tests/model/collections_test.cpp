@@ -6,9 +6,10 @@
 #include <vector>
 
 #include "model/system_and_adapter.h"
-#include "reading.h"
+
 #include "support/elements.h"
 #include "support/fresh_library.h"
+#include "support/reading.h"
 
 namespace {
 

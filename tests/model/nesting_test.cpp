@@ -7,8 +7,9 @@
 #include <string>
 
 #include "model/system_and_adapter.h"
-#include "reading.h"
+
 #include "support/fresh_library.h"
+#include "support/reading.h"
 
 namespace {
 

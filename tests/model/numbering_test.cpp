@@ -8,9 +8,10 @@
 
 #include "model/arrays.h"
 #include "model/enclosures.h"
-#include "reading.h"
+
 #include "support/elements.h"
 #include "support/fresh_library.h"
+#include "support/reading.h"
 
 namespace {
 
