@@ -33,6 +33,11 @@ foreach(header IN LISTS publicHeaders)
 endforeach()
 
 set(packageDir "${CMAKE_INSTALL_LIBDIR}/cmake/RAIDInstrumentation")
+if(CMAKE_INSTALL_LIBDIR STREQUAL "lib32")
+    # Debian's CMake does not look into lib32. Every folder that begins with the package's name is
+    # tried, and the version file turns callers of the other width away.
+    set(packageDir "lib/cmake/RAIDInstrumentation-i386")
+endif()
 install(EXPORT RAIDInstrumentationTargets
     NAMESPACE RAIDInstrumentation:: DESTINATION "${packageDir}")
 configure_package_config_file(

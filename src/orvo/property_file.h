@@ -2,6 +2,7 @@
 
 #include <map>
 #include <string>
+#include <utility>
 
 // The stand-in for the maker's common library: just what reading one settings file takes.
 namespace Orvo {
@@ -30,7 +31,7 @@ public:
     /// The largest file that open reads.
     static constexpr std::size_t sizeLimit = 1024 * 1024;
 
-    explicit PropertyFile(const File::Path& file) : path(file) {}
+    explicit PropertyFile(File::Path file) : path(std::move(file)) {}
 
     /// Reads the file whole. Throws std::runtime_error for a file that is missing, unreadable,
     /// not a regular file or over the size limit. The mode is accepted for the interface's sake;

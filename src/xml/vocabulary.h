@@ -29,10 +29,10 @@ struct Child {
 /// What the trace and the messages say of an element.
 template <class Model>
 struct Words {
-    std::string_view element;  // with its prefix
-    std::string_view endWord;  // what the message about its missing end tag calls it
-    const char* entry;         // log lines
-    const char* exit;
+    std::string_view element;     // with its prefix
+    std::string_view endWord;     // what the message about its missing end tag calls it
+    const char* entry = nullptr;  // log lines
+    const char* exit = nullptr;
     const char* context = "association";   // its line in the message of an error inside it
     std::string Model::*detail = nullptr;  // told after the context
 };
