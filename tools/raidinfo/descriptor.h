@@ -18,6 +18,8 @@ public:
         }
     }
     Descriptor(Descriptor&& other) noexcept : number{std::exchange(other.number, -1)} {}
+    Descriptor(const Descriptor&) = delete;
+    Descriptor& operator=(const Descriptor&) = delete;
     Descriptor& operator=(Descriptor&&) = delete;
     ~Descriptor() {
         if (number >= 0) {

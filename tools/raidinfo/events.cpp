@@ -26,6 +26,8 @@ public:
           wait{library.function<int()>("getEvent")},
           batch{library.variable<const void*>("raidEvents")} {
         checkService();
+        // The check has set it.
+        // NOLINTNEXTLINE(cppcoreguidelines-prefer-member-initializer)
         next = *library.variable<int>("nextSequenceNumber");
     }
 

@@ -17,6 +17,7 @@ public:
     /// reported as unusable.
     template <typename Signature>
     [[nodiscard]] Signature* function(const char* name) const {
+        // NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): what dlsym is made for
         return reinterpret_cast<Signature*>(address(name));
     }
 

@@ -17,7 +17,7 @@ constexpr char32_t lastCodePoint = 0x10FFFF;
 /// UTF-8, and then the bytes are those to be replaced as one.
 struct Decoded {
     std::optional<char32_t> codePoint;
-    std::size_t length;
+    std::size_t length = 0;
 };
 
 struct LeadByte {

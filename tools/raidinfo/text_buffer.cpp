@@ -10,7 +10,7 @@ namespace raidinfo {
 
 // A shared mapping of a sparse file in memory: unlike private memory it is not charged in advance,
 // whatever the machine's overcommit policy.
-TextBuffer::TextBuffer() : bytes{nullptr} {
+TextBuffer::TextBuffer() {
     const int file = memfd_create("raidinfo-text", MFD_CLOEXEC);
     void* mapped = MAP_FAILED;
     if (file >= 0 && ftruncate(file, capacity) == 0) {

@@ -19,7 +19,7 @@ public:
     [[nodiscard]] char* data() const noexcept { return bytes; }
 
 private:
-    char* bytes;
+    char* bytes = nullptr;
 };
 
 }  // namespace raidinfo

@@ -62,8 +62,8 @@ Service::Reply Service::reply(const http::Request& request) const {
     if (get && target == std::string(processor) + "?getConfig")
         return http::Answer{200, served.body()};
     if (get && target == std::string(monitor) + "?getEvents") {
-        constexpr std::numeric_limits<int> range;
-        return http::Answer{200, log.body(range.min(), range.max())};
+        return http::Answer{
+            200, log.body(std::numeric_limits<int>::min(), std::numeric_limits<int>::max())};
     }
     if (get || target != monitor)
         return http::fault({404, "There is no service at this address"});

@@ -26,11 +26,11 @@ public:
     Element& flag(const char* field, bool value) {
         return add(field, "xsd:boolean", value ? "true" : "false");
     }
-    Element& child(const char* name, Element made) {
-        xml::addChild(tree, name, std::move(made.tree));
+    Element& child(const char* name, const Element& made) {
+        xml::addChild(tree, name, made.tree);
         return *this;
     }
-    [[nodiscard]] xml::Tree take() { return std::move(tree); }
+    [[nodiscard]] xml::Tree take() { return tree; }
 
 private:
     Element& add(const char* field, const char* xsiType, const std::string& value) {

@@ -83,9 +83,10 @@ Element enclosure(const AdapterPlan& adapter, const ChannelPlan& channel,
         made.child("ac:powerSupply", part("o:PowerSupply", i, "status", normal));
     for (int i = 0; i < plan.sensors; ++i)
         made.child("ac:tempSensor", part("o:TempSensor", i, "status", normal));
-    for (std::size_t i = 0; i < plan.slots.size(); ++i)
+    for (std::size_t i = 0; i < plan.slots.size(); ++i) {
         made.child("ac:deviceSlotID",
                    part("o:DeviceSlotID", static_cast<int>(i), "slotID", plan.slots[i]));
+    }
     return made;
 }
 
@@ -108,7 +109,7 @@ Element physicalDrives(const AdapterPlan& adapter) {
             channel.child("ac:hardDrive", drive(adapter, plan, each));
         for (const EnclosurePlan& each : plan.enclosures)
             channel.child("ac:enclosure", enclosure(adapter, plan, each));
-        made.child("ac:channel", std::move(channel));
+        made.child("ac:channel", channel);
     }
     return made;
 }
@@ -209,9 +210,9 @@ void addMembers(Element& array, const AdapterPlan& adapter, const ArrayPlan& pla
             any = true;
         }
         if (any)
-            physical.child("ac:channel", std::move(listed));
+            physical.child("ac:channel", listed);
     }
-    array.child("ac:physicalDrives", std::move(physical));
+    array.child("ac:physicalDrives", physical);
 }
 
 Element arrayFields(const AdapterPlan& adapter, const char* xsiType, int id,
@@ -248,7 +249,7 @@ Element spannedArray(const AdapterPlan& adapter, const SpannedPlan& plan) {
     Element made = arrayFields(adapter, "o:SpannedArray", plan.id, plan.name, "", 1);
     made.number("size", size).number("freeSpace", std::max(0, size - usedBy(plan.logicals)));
     made.child("ac:logicalDrives", logicalDrives(adapter, pointers(plan.logicals)));
-    made.child("ac:arrays", std::move(inner));
+    made.child("ac:arrays", inner);
     return made;
 }
 
@@ -336,7 +337,7 @@ xml::Tree document(const SystemPlan& plan) {
         system.child("ac:adapter", adapter(each));
     xml::Tree content;
     xml::addChild(content, "ac:system", system.take());
-    return soap::envelope("m:getConfigResponse", std::move(content));
+    return soap::envelope("m:getConfigResponse", content);
 }
 
 }  // namespace raidsim::generate

@@ -61,10 +61,11 @@ void Server::admit(tcp::socket socket) {
         std::move(socket), service, settings,
         [this](const std::shared_ptr<Session>& closed) { sessions.erase(closed); });
     sessions.insert(session);
-    if (full)
+    if (full) {
         session->refuse({503, "Too many clients"});
-    else
+    } else {
         session->start();
+    }
 }
 
 }  // namespace raidsim

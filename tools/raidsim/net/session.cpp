@@ -51,12 +51,13 @@ void Session::read() {
                            [self = shared_from_this()](error_code error, std::size_t count) {
                                if (self->state == State::closed)
                                    return;
-                               if (error == boost::asio::error::eof)
+                               if (error == boost::asio::error::eof) {
                                    self->ended();
-                               else if (error)
+                               } else if (error) {
                                    self->close();
-                               else
+                               } else {
                                    self->received(count);
+                               }
                            });
 }
 
@@ -64,10 +65,11 @@ void Session::received(std::size_t count) {
     if (state == State::reading) {
         request.append(chunk.data(), count);
         const http::Parsed parsed = http::parse(request);
-        if (const auto* const whole = std::get_if<http::Request>(&parsed))
+        if (const auto* const whole = std::get_if<http::Request>(&parsed)) {
             handle(*whole);
-        else if (const auto* const refusal = std::get_if<http::Refusal>(&parsed))
+        } else if (const auto* const refusal = std::get_if<http::Refusal>(&parsed)) {
             answer(http::fault(*refusal));
+        }
     } else {
         drained += count;
         if (drained > bounds::drainBytes)
@@ -79,10 +81,11 @@ void Session::received(std::size_t count) {
 
 void Session::ended() {
     clientEnded = true;
-    if (state == State::reading && !request.empty())
+    if (state == State::reading && !request.empty()) {
         answer(http::fault({400, "The request is incomplete"}));
-    else if (state != State::answering)
+    } else if (state != State::answering) {
         close();
+    }
 }
 
 void Session::handle(const http::Request& whole) {
@@ -111,10 +114,11 @@ void Session::answer(const http::Answer& content) {
                              [self = shared_from_this()](error_code error, std::size_t) {
                                  if (self->state == State::closed)
                                      return;
-                                 if (error)
+                                 if (error) {
                                      self->close();
-                                 else
+                                 } else {
                                      self->answered();
+                                 }
                              });
 }
 
@@ -122,10 +126,11 @@ void Session::answered() {
     state = State::draining;
     error_code ignored;
     socket.shutdown(tcp::socket::shutdown_send, ignored);
-    if (clientEnded)
+    if (clientEnded) {
         close();
-    else
+    } else {
         limit(settings.drainTime);
+    }
 }
 
 void Session::limit(std::chrono::milliseconds time) {
@@ -137,10 +142,11 @@ void Session::limit(std::chrono::milliseconds time) {
 }
 
 void Session::timedOut() {
-    if (state == State::reading)
+    if (state == State::reading) {
         answer(http::fault({408, "The request did not arrive in time"}));
-    else
+    } else {
         close();
+    }
 }
 
 }  // namespace raidsim

@@ -19,22 +19,22 @@ constexpr std::array<std::pair<const char*, const char*>, 7> namespaces{{
 
 }  // namespace
 
-xml::Tree envelope(const std::string& response, xml::Tree content) {
+xml::Tree envelope(const std::string& response, const xml::Tree& content) {
     xml::Tree body;
-    xml::addChild(body, response, std::move(content));
+    xml::addChild(body, response, content);
     xml::Tree outer;
     for (const auto& [name, uri] : namespaces)
         xml::addAttribute(outer, name, uri);
-    xml::addChild(outer, "env:Body", std::move(body));
+    xml::addChild(outer, "env:Body", body);
     xml::Tree document;
-    xml::addChild(document, "env:Envelope", std::move(outer));
+    xml::addChild(document, "env:Envelope", outer);
     return document;
 }
 
 std::string returnValueBody(const std::string& response, int value) {
     xml::Tree content;
     xml::addText(content, "as:return", "xsd:int", std::to_string(value));
-    return xml::format(envelope(response, std::move(content)));
+    return xml::format(envelope(response, content));
 }
 
 std::string faultBody(Blame blame, const std::string& reason) {
@@ -44,11 +44,11 @@ std::string faultBody(Blame blame, const std::string& reason) {
     xml::Tree text(reason);
     xml::addAttribute(text, "xml:lang", "en");
     xml::Tree reasons;
-    xml::addChild(reasons, "env:Text", std::move(text));
+    xml::addChild(reasons, "env:Text", text);
     xml::Tree fault;
-    xml::addChild(fault, "env:Code", std::move(code));
-    xml::addChild(fault, "env:Reason", std::move(reasons));
-    return xml::format(envelope("env:Fault", std::move(fault)));
+    xml::addChild(fault, "env:Code", code);
+    xml::addChild(fault, "env:Reason", reasons);
+    return xml::format(envelope("env:Fault", fault));
 }
 
 }  // namespace raidsim::soap

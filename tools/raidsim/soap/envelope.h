@@ -7,7 +7,7 @@
 namespace raidsim::soap {
 
 // An answer document: env:Envelope / env:Body / the response element.
-[[nodiscard]] xml::Tree envelope(const std::string& response, xml::Tree content);
+[[nodiscard]] xml::Tree envelope(const std::string& response, const xml::Tree& content);
 
 // An answer with one return element, such as that of getNewestEvent.
 [[nodiscard]] std::string returnValueBody(const std::string& response, int value);

@@ -31,10 +31,10 @@ TreeType* systemOf(TreeType& document) {
 Document Document::parse(std::string_view text) {
     xml::Tree tree = xml::parse(text);
     if (xml::childOf(tree, root) != nullptr)
-        tree = soap::envelope(response, std::move(tree));
+        tree = soap::envelope(response, tree);
     if (systemOf(tree) == nullptr)
         throw xml::XmlError("there is no ac:system element, bare or in a getConfig answer");
-    return Document(std::move(tree));
+    return Document(tree);
 }
 
 Document Document::read(const std::string& path) { return parse(readFile(path)); }

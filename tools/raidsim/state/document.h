@@ -25,7 +25,7 @@ public:
     [[nodiscard]] std::string systemName() const { return xml::textOf(system(), "as:name"); }
 
 private:
-    explicit Document(xml::Tree wrapped) : tree(std::move(wrapped)) {}
+    explicit Document(const xml::Tree& wrapped) : tree(wrapped) {}
 
     xml::Tree tree;
     mutable std::string rendered;

@@ -63,9 +63,10 @@ xml::Tree* channelIn(xml::Tree& physical, const std::string& id) {
 // Goes down to where an array lists the drives of a channel, making what is missing.
 void enterChannel(std::vector<xml::Tree*>& way, const xml::Tree& original) {
     xml::Tree* physical = xml::childOf(*way.back(), physicalDrives);
-    if (physical == nullptr)
+    if (physical == nullptr) {
         physical =
             &way.back()->push_back({physicalDrives, xml::element("o:PhysicalDrives")})->second;
+    }
     way.push_back(physical);
     xml::Tree* listed = channelIn(*physical, xml::textOf(original, channelId));
     if (listed == nullptr) {
@@ -150,7 +151,7 @@ void setProgress(Document& document, const Path& path, int percent) {
         match.node->erase(progress);
         xml::Tree task = xml::element("o:Progress");
         xml::addText(task, "as:percentComplete", "xsd:int", std::to_string(percent));
-        xml::addChild(*match.node, progress, std::move(task));
+        xml::addChild(*match.node, progress, task);
     }
 }
 

@@ -65,9 +65,10 @@ int EventLog::append(const Fields& fields) {
     if (!given && last == std::numeric_limits<int>::max())
         throw EventError("there are no more sequence numbers");
     const int sequenceNumber = given ? parseInt(*given).value() : last + 1;
-    if (sequenceNumber <= last)
+    if (sequenceNumber <= last) {
         throw EventError("sequenceNumber " + std::to_string(sequenceNumber) +
                          " is not above the newest, " + std::to_string(last));
+    }
 
     xml::Tree event = xml::element("o:Event");
     for (const Field& field : vocabulary) {
@@ -76,7 +77,7 @@ int EventLog::append(const Fields& fields) {
         if (value)
             xml::addText(event, "as:" + std::string(field.name), field.xsiType, *value);
     }
-    events.push_back({sequenceNumber, std::move(event)});
+    events.push_back({sequenceNumber, event});
     if (events.size() > capacity)
         events.pop_front();
     last = sequenceNumber;
@@ -90,17 +91,18 @@ std::string EventLog::body(int start, int end) const {
          entry != events.end() && entry->sequenceNumber <= end; ++entry)
         xml::addChild(list, "ac:event", entry->event);
     xml::Tree content;
-    xml::addChild(content, "ac:events", std::move(list));
-    return xml::format(soap::envelope("m:getEventsResponse", std::move(content)));
+    xml::addChild(content, "ac:events", list);
+    return xml::format(soap::envelope("m:getEventsResponse", content));
 }
 
 EventLog::Ticket EventLog::await(int lastRetrieved, Waiter waiter) {
     const auto next = std::ranges::upper_bound(events, lastRetrieved, {}, &Entry::sequenceNumber);
     const Ticket ticket = nextTicket++;
-    if (next != events.end())
+    if (next != events.end()) {
         waiter(next->sequenceNumber);
-    else
+    } else {
         waiters.emplace(ticket, Wait{lastRetrieved, std::move(waiter)});
+    }
     return ticket;
 }
 

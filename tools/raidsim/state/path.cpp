@@ -35,9 +35,10 @@ Path::Step parseStep(std::string_view text) {
     if (kind == kinds.end())
         throw PathError("there is no kind of object \"" + std::string(name) + "\"");
     const bool numbered = colon != std::string_view::npos;
-    if (numbered == kind->idField.empty())
+    if (numbered == kind->idField.empty()) {
         throw PathError("\"" + std::string(name) + "\" " +
                         (numbered ? "takes no number" : "needs a number"));
+    }
     const std::string_view id = numbered ? text.substr(colon + 1) : std::string_view();
     if (numbered && id != "*" && !parseInt(id))
         throw PathError("\"" + std::string(id) + "\" is not a number");

@@ -32,10 +32,11 @@ void appendAttributes(std::string& out, const Tree& attributes) {
         const char quote = value.data().find('"') == std::string::npos ? '"' : '\'';
         out.append(1, ' ').append(name).append(1, '=').append(1, quote);
         for (const char c : value.data()) {
-            if (c == quote)
+            if (c == quote) {
                 out += quote == '"' ? "&quot;" : "&apos;";
-            else
+            } else {
                 appendEscaped(out, std::string_view(&c, 1));
+            }
         }
         out += quote;
     }
@@ -106,15 +107,15 @@ void addAttribute(Tree& element, const std::string& name, const std::string& val
     attributes->push_back({name, Tree(value)});
 }
 
-void addChild(Tree& parent, const std::string& name, Tree child) {
-    parent.push_back({name, std::move(child)});
+void addChild(Tree& parent, const std::string& name, const Tree& child) {
+    parent.push_back({name, child});
 }
 
 void addText(Tree& parent, const std::string& name, const std::string& xsiType,
              const std::string& value) {
     Tree child = element(xsiType);
     child.data() = value;
-    addChild(parent, name, std::move(child));
+    addChild(parent, name, child);
 }
 
 const Tree* childOf(const Tree& parent, const std::string& name) {

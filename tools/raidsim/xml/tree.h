@@ -28,7 +28,7 @@ public:
 
 [[nodiscard]] Tree element(const std::string& xsiType);
 void addAttribute(Tree& element, const std::string& name, const std::string& value);
-void addChild(Tree& parent, const std::string& name, Tree child);
+void addChild(Tree& parent, const std::string& name, const Tree& child);
 
 // A simple child with its xsi:type ("xsd:int", "xsd:string", "xsd:boolean").
 void addText(Tree& parent, const std::string& name, const std::string& xsiType,

@@ -51,10 +51,11 @@ public:
     void run() {
         skip("\xEF\xBB\xBF");
         while (at < text.size()) {
-            if (text[at] == '<')
+            if (text[at] == '<') {
                 readMarkup();
-            else
+            } else {
                 readCharacters();
+            }
         }
         if (!open.empty())
             fail("element \"" + std::string(open.back()) + "\" is not closed");
@@ -152,10 +153,11 @@ private:
         skipBlanks();
         if (!skip(">"))
             fail("the end tag of \"" + std::string(name) + "\" is not closed");
-        if (open.empty() || open.back() != name)
+        if (open.empty() || open.back() != name) {
             fail("end tag of \"" + std::string(name) + "\" where " +
                  (open.empty() ? "no element is open"
                                : "\"" + std::string(open.back()) + "\" is open"));
+        }
         open.pop_back();
     }
 
