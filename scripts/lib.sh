@@ -8,6 +8,7 @@ jobs=$(nproc)
 buildPackages=(cmake g++ libboost-dev libcli11-dev ninja-build nlohmann-json3-dev)
 testPackages=(g++-multilib googletest pkgconf)
 checkPackages=(clang clang-format clang-tidy shellcheck)
+fuzzPackages=(clang libclang-rt-14-dev libxml2-dev)
 
 say() { printf '%s\n' "$@"; }
 

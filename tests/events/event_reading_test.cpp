@@ -3,8 +3,6 @@
 #include <gtest/gtest.h>
 
 #include <string>
-#include <type_traits>
-#include <variant>
 #include <vector>
 
 #include "events/raid_events.h"
@@ -12,7 +10,6 @@
 #include "support/files.h"
 #include "support/fresh_library.h"
 #include "support/reading.h"
-#include "support/row.h"
 
 namespace {
 
@@ -24,86 +21,6 @@ std::string missing(const std::string& what, const std::string& found) {
 }
 
 class EventReading : public FreshLibrary {};
-
-struct Field : Row {
-    using Number = int (RAIDEvent::*)() const;
-    using Text = std::string (RAIDEvent::*)() const;
-    std::variant<Number, Text> getter;
-};
-
-// Each called after its element.
-const std::vector<Field> fields{
-    {"serverName", &RAIDEvent::getServerName},
-    {"serverAddress", &RAIDEvent::getServerAddress},
-    {"date", &RAIDEvent::getDate},
-    {"string", &RAIDEvent::getMessageString},
-    {"fru", &RAIDEvent::getFru},
-    {"sequenceNumber", &RAIDEvent::getSequenceNumber},
-    {"eventCode", &RAIDEvent::getEventCode},
-    {"type", &RAIDEvent::getType},
-    {"adapter", &RAIDEvent::getAdapter},
-    {"logicalDrive", &RAIDEvent::getLogicalDrive},
-    {"channel", &RAIDEvent::getChannel},
-    {"deviceID", &RAIDEvent::getDeviceID},
-    {"enclosureID", &RAIDEvent::getEnclosureID},
-};
-
-// The field as text, whatever it is.
-std::string valueOf(const RAIDEvent& event, const Field& field) {
-    const auto text = [&](auto getter) -> std::string {
-        if constexpr (std::is_same_v<decltype(getter), Field::Text>) {
-            return (event.*getter)();
-        } else {
-            return std::to_string((event.*getter)());
-        }
-    };
-    return std::visit(text, field.getter);
-}
-
-std::string startValueOf(const Field& field) {
-    return std::holds_alternative<Field::Text>(field.getter) ? "" : "0";
-}
-
-class EventField : public FreshLibrary, public testing::WithParamInterface<Field> {
-protected:
-    static std::string event(std::string_view content) {
-        return element("ac:event", element("as:" + GetParam().name, content));
-    }
-};
-
-TEST_P(EventField, TakesItsElementAndNoOther) {
-    const auto read42 = read<RAIDEvent>(event("42"));
-    for (const Field& field : fields) {
-        EXPECT_EQ(valueOf(read42, field),
-                  field.name == GetParam().name ? "42" : startValueOf(field))
-            << field.name;
-    }
-}
-
-TEST_P(EventField, KeepsItsValueWhenTheElementIsEmptyEitherWay) {
-    const std::string tag = "as:" + GetParam().name;
-    for (const std::string& empty : {element(tag, ""), "<" + tag + "/>"}) {
-        const auto first = element("ac:event", empty);
-        EXPECT_EQ(valueOf(read<RAIDEvent>(first), GetParam()), startValueOf(GetParam()));
-        const auto second = element("ac:event", element(tag, "7") + empty);
-        EXPECT_EQ(valueOf(read<RAIDEvent>(second), GetParam()), "7");
-    }
-}
-
-TEST_P(EventField, IsNamedWhenItsEndTagIsMissing) {
-    const std::string& name = GetParam().name;
-    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1</ac:event>"),
-              missing(name, "ac:event"));
-    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1<as:fru>"), missing(name, "as:fru"));
-    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event><as:" + name + ">1"), missing(name, ""));
-}
-
-TEST_P(EventField, IsNamedInTheErrorOfItsStrayEndTag) {
-    EXPECT_EQ(errorOf<RAIDEvent>("<ac:event></as:" + GetParam().name + "></ac:event>"),
-              missing("Event", "as:" + GetParam().name));
-}
-
-INSTANTIATE_TEST_SUITE_P(Fields, EventField, testing::ValuesIn(fields), nameOfRow);
 
 TEST_F(EventReading, YieldsAnEmptyBatchOfAnEmptyElement) {
     for (const char* const empty : {"<ac:events></ac:events>", "<ac:events/>"}) {
@@ -127,16 +44,6 @@ TEST_F(EventReading, KeepsTheOrderOfTheDocument) {
 TEST_F(EventReading, KeepsADateAsItWasSent) {
     for (const char* const date : {"2003-02-30T25:61:00+99:00", "yesterday", "12  May &amp; so"}) {
         EXPECT_EQ(read<RAIDEvent>(element("ac:event", element("as:date", date))).getDate(), date);
-    }
-}
-
-TEST_F(EventReading, StartsEveryFieldAtZeroOrEmpty) {
-    for (const RAIDEvent& event : {RAIDEvent(), read<RAIDEvent>("<ac:event></ac:event>")}) {
-        for (const Field& field : fields) {
-            EXPECT_EQ(valueOf(event, field), startValueOf(field)) << field.name;
-        }
-        EXPECT_EQ(event.getEventType(), "");
-        event.dump();
     }
 }
 

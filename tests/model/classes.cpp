@@ -1,99 +1,13 @@
 #include "classes.h"
 
-#include <memory>
-#include <type_traits>
-#include <variant>
-
 #include "model/arrays.h"
 #include "model/channels_and_drives.h"
+#include "model/describe.h"
 #include "model/enclosures.h"
 #include "model/logical_drives.h"
 #include "model/system_and_adapter.h"
-#include "xml/raid_xml_error.h"
 
 namespace raid::test {
-namespace {
-
-std::string shown(const std::string& text) { return text; }
-std::string shown(int number) { return std::to_string(number); }
-
-// Builds the description of one class from rows that name a child and its getter.
-template <class Model>
-class Describe {
-public:
-    Describe(const char* name, std::string_view element, std::string_view endWord,
-             std::string (Model::*type)() const)
-        : described(name, element, endWord) {
-        getters->type = type;
-        described.read = [getters = getters](const std::string& text) {
-            return reading(*getters, text);
-        };
-    }
-
-    Describe& number(const char* name, int (Model::*getter)() const) {
-        return add(name, Kind::number, getter);
-    }
-    Describe& flag(const char* name, int (Model::*getter)() const) {
-        return add(name, Kind::flag, getter);
-    }
-    Describe& text(const char* name, std::string (Model::*getter)() const) {
-        return add(name, Kind::text, getter);
-    }
-    Describe& endWordOf(const char* name, const char* word) {
-        for (auto& field : described.fields) {
-            if (field.name == name) {
-                field.endWord = word;
-            }
-        }
-        return *this;
-    }
-    Describe& exitsAs(const char* name) {
-        described.exitName = name;
-        return *this;
-    }
-    Describe& inContext(const char* context) {
-        described.context = context;
-        return *this;
-    }
-
-    operator ModelClass() const { return described; }
-
-private:
-    using Getter = std::variant<int (Model::*)() const, std::string (Model::*)() const>;
-
-    struct Getters {
-        std::string (Model::*type)() const = nullptr;
-        std::vector<Getter> fields;
-    };
-
-    Describe& add(const char* name, Kind kind, Getter getter) {
-        described.fields.push_back({name, kind, name});
-        getters->fields.push_back(getter);
-        return *this;
-    }
-
-    static Reading reading(const Getters& getters, const std::string& text) {
-        Reading result;
-        try {
-            const Model model(text.data(), static_cast<int>(text.size()), &result.consumed);
-            if (getters.type != nullptr) {
-                result.type = (model.*getters.type)();
-            }
-            for (const auto& getter : getters.fields) {
-                result.values.push_back(
-                    std::visit([&](auto get) { return shown((model.*get)()); }, getter));
-            }
-        } catch (const RAIDXMLError& error) {
-            result.error = error.getMessage();
-        }
-        return result;
-    }
-
-    ModelClass described;
-    std::shared_ptr<Getters> getters = std::make_shared<Getters>();
-};
-
-}  // namespace
 
 std::string ModelClass::missing(std::string_view word, std::string_view found) const {
     return std::string("XML syntax error: End of \"")
@@ -107,7 +21,18 @@ std::string ModelClass::unknown(std::string_view found) const {
     return std::string("XML syntax error: Unknown element in   : ").append(found).append(context);
 }
 
+const std::vector<ModelClass>& passedClasses() {
+    static const std::vector<ModelClass> classes{
+        Describe<RAIDChunks>("RAIDChunks", "ac:chunks", "chunks", &RAIDChunks::getChunksType),
+        // These two keep nothing that can be asked for.
+        Describe<RAIDLimits>("RAIDLimits", "ac:limits", "limits", nullptr),
+        Describe<RAIDProgress>("RAIDProgress", "ac:progress", "progress", nullptr),
+    };
+    return classes;
+}
+
 const std::vector<ModelClass>& modelClasses() {
+    (void)passedClasses();  // logical drives show their chunks
     static const std::vector<ModelClass> classes{
         Describe<RAIDLogicalDrive>("RAIDLogicalDrive", "ac:logicalDrive", "logicalDrive",
                                    &RAIDLogicalDrive::getLogicalDriveType)
@@ -126,10 +51,13 @@ const std::vector<ModelClass>& modelClasses() {
             .text("name", &RAIDLogicalDrive::getName)
             .number("readCacheMode", &RAIDLogicalDrive::getReadCacheMode)
             .number("adapterID", &RAIDLogicalDrive::getAdapterID)
-            .number("logicalID", &RAIDLogicalDrive::getLogicalID),
+            .number("logicalID", &RAIDLogicalDrive::getLogicalID)
+            .one("ac:chunks", &RAIDLogicalDrive::getChunks)
+            .knows("ac:progress"),
         Describe<RAIDLogicalDrives>("RAIDLogicalDrives", "ac:logicalDrives", "logicalDrives",
                                     &RAIDLogicalDrives::getLogicalDrivesType)
-            .number("overallStatus", &RAIDLogicalDrives::getOverallStatus),
+            .number("overallStatus", &RAIDLogicalDrives::getOverallStatus)
+            .each({"ac:logicalDrive"}, &RAIDLogicalDrives::getLogicalDrive),
         Describe<RAIDFan>("RAIDFan", "ac:fan", "Fan", &RAIDFan::getFanType)
             .number("index", &RAIDFan::getIndex)
             .number("status", &RAIDFan::getStatus),
@@ -160,7 +88,11 @@ const std::vector<ModelClass>& modelClasses() {
             .number("state", &RAIDEnclosureDevice::getState)
             .text("model", &RAIDEnclosureDevice::getModel)
             .text("serialNumber", &RAIDEnclosureDevice::getSerialNumber)
-            .text("interfaceType", &RAIDEnclosureDevice::getInterfaceType),
+            .text("interfaceType", &RAIDEnclosureDevice::getInterfaceType)
+            .each({"ac:fan"}, &RAIDEnclosureDevice::getFans)
+            .each({"ac:powerSupply"}, &RAIDEnclosureDevice::getPowerSupplys)
+            .each({"ac:tempSensor"}, &RAIDEnclosureDevice::getTempSensors)
+            .each({"ac:deviceSlotID"}, &RAIDEnclosureDevice::getDeviceSlotIDs),
         Describe<RAIDHardDrive>("RAIDHardDrive", "ac:hardDrive", "HardDrive",
                                 &RAIDHardDrive::getHardDriveType)
             .text("firmwareLevel", &RAIDHardDrive::getFirmwareLevel)
@@ -182,22 +114,29 @@ const std::vector<ModelClass>& modelClasses() {
             .number("hotSpareType", &RAIDHardDrive::getHotSpareType)
             .number("deviceID", &RAIDHardDrive::getDeviceID)
             .number("adapterID", &RAIDHardDrive::getAdapterID)
-            .number("channelID", &RAIDHardDrive::getChannelID),
+            .number("channelID", &RAIDHardDrive::getChannelID)
+            .knows("ac:progress"),
         Describe<RAIDChannel>("RAIDChannel", "ac:channel", "channel", &RAIDChannel::getChannelType)
             .number("initiatorID", &RAIDChannel::getInitiatorID)
             .number("channelID", &RAIDChannel::getChannelID)
             .number("type", &RAIDChannel::getType)
             .number("transferSpeed", &RAIDChannel::getTransferSpeed)
             .number("overallStatus", &RAIDChannel::getOverallStatus)
-            .number("adapterID", &RAIDChannel::getAdapterID),
+            .number("adapterID", &RAIDChannel::getAdapterID)
+            .each({"ac:hardDrive"}, &RAIDChannel::getHardDrive)
+            .each({"ac:enclosure"}, &RAIDChannel::getEnclosureDevice),
         Describe<RAIDPhysicalDrives>("RAIDPhysicalDrives", "ac:physicalDrives", "physicalDrives",
                                      &RAIDPhysicalDrives::getPhysicalDrivesType)
-            .number("overallStatus", &RAIDPhysicalDrives::getOverallStatus),
+            .number("overallStatus", &RAIDPhysicalDrives::getOverallStatus)
+            .each({"ac:channel"}, &RAIDPhysicalDrives::getChannel),
         Describe<RAIDHotSpareDrives>("RAIDHotSpareDrives", "ac:hotSpareDrives", "HotSpareDrives",
                                      &RAIDHotSpareDrives::getHotSpareDrivesType)
-            .number("overallStatus", &RAIDHotSpareDrives::getOverallStatus),
+            .number("overallStatus", &RAIDHotSpareDrives::getOverallStatus)
+            .each({"ac:hardDrive"}, &RAIDHotSpareDrives::getHardDrive),
         Describe<RAIDArrays>("RAIDArrays", "ac:arrays", "arrays", &RAIDArrays::getArraysType)
-            .number("overallStatus", &RAIDArrays::getOverallStatus),
+            .number("overallStatus", &RAIDArrays::getOverallStatus)
+            .each({"ac:basicArray"}, &RAIDArrays::getBasicArray)
+            .each({"ac:spannedArray"}, &RAIDArrays::getSpannedArray),
         Describe<RAIDBasicArray>("RAIDBasicArray", "ac:basicArray", "basicArray",
                                  &RAIDBasicArray::getBasicArrayType)
             .flag("isSubArray", &RAIDBasicArray::getIsSubArray)
@@ -210,6 +149,9 @@ const std::vector<ModelClass>& modelClasses() {
             .text("name", &RAIDBasicArray::getName)
             .number("arrayID", &RAIDBasicArray::getArrayID)
             .number("adapterID", &RAIDBasicArray::getAdapterID)
+            .one("ac:logicalDrives", &RAIDBasicArray::getLogicalDrives)
+            .one("ac:physicalDrives", &RAIDBasicArray::getPhysicalDrives)
+            .each({"ac:hardDrive"}, &RAIDBasicArray::getHardDrives)
             .exitsAs("RAIDSystem"),
         Describe<RAIDSpannedArray>("RAIDSpannedArray", "ac:spannedArray", "spannedArray",
                                    &RAIDSpannedArray::getSpannedArrayType)
@@ -222,6 +164,8 @@ const std::vector<ModelClass>& modelClasses() {
             .text("name", &RAIDSpannedArray::getName)
             .number("arrayID", &RAIDSpannedArray::getArrayID)
             .number("adapterID", &RAIDSpannedArray::getAdapterID)
+            .one("ac:logicalDrives", &RAIDSpannedArray::getLogicalDrives)
+            .one("ac:arrays", &RAIDSpannedArray::getArrays)
             .exitsAs("RAIDSystem"),
         Describe<RAIDAdapter>("RAIDAdapter", "ac:adapter", "adapter", &RAIDAdapter::getAdapterType)
             .flag("hotSwapRebuild", &RAIDAdapter::getHotSwapRebuild)
@@ -259,6 +203,12 @@ const std::vector<ModelClass>& modelClasses() {
             .number("pciVendorID", &RAIDAdapter::getPciVendorID)
             .number("pciBus", &RAIDAdapter::getPciBus)
             .number("pciDeviceID", &RAIDAdapter::getPciDeviceID)
+            .one("ac:arrays", &RAIDAdapter::getArrays)
+            .each({"ac:logicalDrives", "ac:logicalDrive"}, &RAIDAdapter::getLogicaldrives)
+            .one("ac:hotSpareDrives", &RAIDAdapter::getHotsparedrives)
+            .each({"ac:physicalDrives", "ac:channel"}, &RAIDAdapter::getPhysicaldrives)
+            .knows("ac:progress")
+            .knows("ac:limits")
             .endWordOf("alarmStatus", "as:alarmStatus")
             .exitsAs("RAIDSystem")
             .inContext("\nRAIDSystem:\n"),
@@ -267,17 +217,9 @@ const std::vector<ModelClass>& modelClasses() {
             .text("os", &RAIDSystem::getOS)
             .number("overallStatus", &RAIDSystem::getOverallStatus)
             .text("agentVersion", &RAIDSystem::getAgentVersion)
+            .each({"ac:adapter"}, &RAIDSystem::getAdapters)
+            .knows("as:name")
             .inContext("\nsystem:\n"),
-    };
-    return classes;
-}
-
-const std::vector<ModelClass>& passedClasses() {
-    static const std::vector<ModelClass> classes{
-        Describe<RAIDChunks>("RAIDChunks", "ac:chunks", "chunks", &RAIDChunks::getChunksType),
-        // These two keep nothing that can be asked for.
-        Describe<RAIDLimits>("RAIDLimits", "ac:limits", "limits", nullptr),
-        Describe<RAIDProgress>("RAIDProgress", "ac:progress", "progress", nullptr),
     };
     return classes;
 }

@@ -20,10 +20,19 @@ struct Field {
 
 // What became of reading one element.
 struct Reading {
-    std::string error;  // message, or empty
+    std::string error = {};  // message, or empty
     int consumed = 0;
-    std::string type;                 // of the "xsi:type" attribute
-    std::vector<std::string> values;  // of the fields, in their order
+    std::string type = {};                 // of the "xsi:type" attribute
+    std::vector<std::string> values = {};  // of the fields, in their order
+    // Of the elements inside, kind by kind in the order of the class's description.
+    std::vector<std::vector<Reading>> inside = {};
+};
+
+// A kind of elements inside an element that a getter shows: where they stand below it, and whether
+// there is one of them at most, the last.
+struct Inside {
+    std::vector<std::string> path;
+    bool single;
 };
 
 struct ModelClass : Row {
@@ -35,6 +44,8 @@ struct ModelClass : Row {
     std::string exitName;  // in its last line of the trace
     std::string context = "\nassociation:\n";
     std::vector<Field> fields;
+    std::vector<Inside> inside;
+    std::vector<std::string> unshown;  // children that are known and that no getter shows
     std::function<Reading(const std::string& text)> read;
 
     [[nodiscard]] std::string missing(std::string_view word, std::string_view found) const;

@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "classes.h"
+#include "events/event_classes.h"
 #include "support/elements.h"
 #include "support/files.h"
 #include "support/fresh_library.h"
@@ -190,6 +191,7 @@ TEST_P(ElementReading, IsEmptyAsAnEmptyElementTag) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Of, ElementReading, testing::ValuesIn(modelClasses()), nameOfRow);
+INSTANTIATE_TEST_SUITE_P(OfEvents, ElementReading, testing::ValuesIn(eventClasses()), nameOfRow);
 
 // The lines of the constructors in the trace of reading a text.
 std::vector<std::string> constructorLines() {
@@ -221,6 +223,7 @@ TEST_P(ElementTrace, HasNoExitLineAfterAnError) {
 }
 
 INSTANTIATE_TEST_SUITE_P(Of, ElementTrace, testing::ValuesIn(modelClasses()), nameOfRow);
+INSTANTIATE_TEST_SUITE_P(OfEvents, ElementTrace, testing::ValuesIn(eventClasses()), nameOfRow);
 INSTANTIATE_TEST_SUITE_P(OfPassed, ElementTrace, testing::ValuesIn(passedClasses()), nameOfRow);
 
 class PassedElement : public ElementReading {};
