@@ -7,19 +7,12 @@
 
 #include <cerrno>
 
+#include "base/repeat_on_signal.h"
+
 namespace raid::base {
 namespace {
 
 constexpr int forever = -1;
-
-template <class Call>
-auto repeatOnSignal(Call call) noexcept {
-    auto result = call();
-    while (result < 0 && errno == EINTR) {
-        result = call();
-    }
-    return result;
-}
 
 int waitFor(int descriptor, short events, int milliseconds) noexcept {
     pollfd entry{descriptor, events, 0};

@@ -10,6 +10,7 @@ std::variant<Options, HelpWanted> parseOptions(int argc, const char* const* argv
     app.add_option("CONFIG", options.config, "Configuration document to serve")->required();
     app.add_option("--init", options.init, "File of control commands to run before listening");
     app.add_option("--scenario", options.scenario, "File of timed control commands to play");
+    app.add_option("--fault", options.fault, "Fault file whose cases the clients meet in turn");
     app.add_option("--speed", options.speed, "How much faster the scenario's time passes")
         ->check(CLI::Range(0.001, 1e6))
         ->capture_default_str();

@@ -11,6 +11,7 @@ struct Options {
     std::string config;
     std::string init;      // empty: none
     std::string scenario;  // empty: none
+    std::string fault;     // empty: none
     double speed = 1;
     std::uint16_t port = 34572;
 };

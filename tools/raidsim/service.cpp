@@ -17,6 +17,8 @@ namespace {
 constexpr std::string_view processor = "/SOAPService/DataProcessor";
 constexpr std::string_view monitor = "/SOAPService/RaidMonitor";
 
+constexpr std::pair everyEvent{std::numeric_limits<int>::min(), std::numeric_limits<int>::max()};
+
 std::string isoDate(std::chrono::system_clock::time_point when) {
     const std::time_t seconds = std::chrono::system_clock::to_time_t(when);
     std::tm parts{};
@@ -56,14 +58,33 @@ Service::Reply replyToCall(const soap::Request& call, const EventLog& log) {
 Service::Service(Document initial, std::string path, Clock now)
     : served(std::move(initial)), file(std::move(path)), clock(std::move(now)) {}
 
+std::optional<RequestKind> Service::kindOf(const http::Request& request) {
+    if (request.method == "GET") {
+        if (request.target == std::string(processor) + "?getConfig")
+            return RequestKind::config;
+        if (request.target == std::string(monitor) + "?getEvents")
+            return RequestKind::events;
+        return std::nullopt;
+    }
+    try {
+        return std::visit(Overloaded{
+                              [](const soap::GetNewestEvent&) { return RequestKind::newest; },
+                              [](const soap::WaitNextEvent&) { return RequestKind::wait; },
+                              [](const soap::GetEvents&) { return RequestKind::events; },
+                          },
+                          soap::decode(request.body));
+    } catch (const soap::RequestError&) {
+        return std::nullopt;
+    }
+}
+
 Service::Reply Service::reply(const http::Request& request) const {
     const bool get = request.method == "GET";
     const std::string_view target = request.target;
     if (get && target == std::string(processor) + "?getConfig")
         return http::Answer{200, served.body()};
     if (get && target == std::string(monitor) + "?getEvents") {
-        return http::Answer{
-            200, log.body(std::numeric_limits<int>::min(), std::numeric_limits<int>::max())};
+        return http::Answer{200, log.body(everyEvent.first, everyEvent.second)};
     }
     if (get || target != monitor)
         return http::fault({404, "There is no service at this address"});
@@ -72,6 +93,21 @@ Service::Reply Service::reply(const http::Request& request) const {
     } catch (const soap::RequestError& error) {
         return http::fault({400, error.what()});
     }
+}
+
+std::string Service::goodBody(RequestKind kind) const {
+    switch (kind) {
+        case RequestKind::config:
+        case RequestKind::any:
+            break;
+        case RequestKind::events:
+            return log.body(everyEvent.first, everyEvent.second);
+        case RequestKind::wait:
+            return answerToWait(log.newest()).body;
+        case RequestKind::newest:
+            return soap::returnValueBody("m:getNewestEventResponse", log.newest());
+    }
+    return served.body();
 }
 
 http::Answer Service::answerToWait(int sequenceNumber) {

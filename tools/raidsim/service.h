@@ -2,9 +2,11 @@
 
 #include <chrono>
 #include <functional>
+#include <optional>
 #include <string>
 #include <variant>
 
+#include "fault/desk.h"
 #include "http/message.h"
 #include "state/document.h"
 #include "state/event_log.h"
@@ -30,6 +32,12 @@ public:
     [[nodiscard]] Reply reply(const http::Request& request) const;
     [[nodiscard]] static http::Answer answerToWait(int sequenceNumber);
 
+    // What the request asks for; nothing when it is not understood.
+    [[nodiscard]] static std::optional<RequestKind> kindOf(const http::Request& request);
+
+    // What a client would be answered that asks for this now, and waits for nothing.
+    [[nodiscard]] std::string goodBody(RequestKind kind) const;
+
     // Serves the document of another file, or of the same one when the path is empty. Throws
     // FileError or XmlError and then goes on with the old document.
     void reload(const std::string& path = {});
@@ -39,6 +47,7 @@ public:
 
     [[nodiscard]] Document& document() noexcept { return served; }
     [[nodiscard]] EventLog& events() noexcept { return log; }
+    [[nodiscard]] FaultDesk& faults() noexcept { return desk; }
     [[nodiscard]] const std::string& documentPath() const noexcept { return file; }
 
 private:
@@ -46,6 +55,7 @@ private:
     std::string file;
     Clock clock;
     EventLog log;
+    FaultDesk desk;
 };
 
 }  // namespace raidsim

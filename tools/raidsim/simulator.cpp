@@ -43,7 +43,9 @@ Simulator::Simulator(const Options& options, std::ostream& replies, std::ostream
       speed(options.speed),
       scenarioTimer(context),
       signals(context, SIGINT, SIGTERM, SIGHUP) {
+    service.faults().tell = [this](const std::string& line) { out << line << std::endl; };
     runInit(options.init);
+    armFault(options.fault);
     listen(options.port);
     out << "raidsim: listening on 127.0.0.1:" << server->port() << std::endl;
 }
@@ -69,6 +71,18 @@ void Simulator::runInit(const std::string& path) {
             throw StartError(ExitStatus::badInput,
                              path + ": line " + std::to_string(line.number) + ": " + error.what());
         }
+    }
+}
+
+void Simulator::armFault(const std::string& path) {
+    if (path.empty())
+        return;
+    try {
+        service.faults().arm(std::make_shared<const FaultFile>(path), std::nullopt);
+    } catch (const FileError& error) {
+        throw StartError(ExitStatus::noInput, path + ": " + error.what());
+    } catch (const FaultError& error) {
+        throw StartError(ExitStatus::badInput, path + ": " + error.what());
     }
 }
 

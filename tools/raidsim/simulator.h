@@ -48,6 +48,7 @@ public:
 
 private:
     void runInit(const std::string& path);
+    void armFault(const std::string& path);
     void listen(std::uint16_t port);
     void obeySignals();
     void obey(const Command& command, const std::string& origin);

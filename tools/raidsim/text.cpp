@@ -24,6 +24,17 @@ std::optional<int> parseInt(std::string_view text) noexcept {
     return value;
 }
 
+std::optional<std::chrono::milliseconds> parseSeconds(std::string_view text) noexcept {
+    constexpr double longest = 1e6;
+    double seconds = 0;
+    const char* const end = text.data() + text.size();
+    const auto [stop, error] = std::from_chars(text.data(), end, seconds, std::chars_format::fixed);
+    // Written so that "nan" fails too.
+    if (error != std::errc{} || stop != end || !(seconds >= 0 && seconds <= longest))
+        return std::nullopt;
+    return std::chrono::round<std::chrono::milliseconds>(std::chrono::duration<double>(seconds));
+}
+
 std::string_view trim(std::string_view text) noexcept {
     constexpr std::string_view blanks = " \t\r\n";
     const auto first = text.find_first_not_of(blanks);

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -9,6 +10,9 @@ namespace raidsim {
 
 // A 32-bit decimal number that fills the whole text, or nothing.
 [[nodiscard]] std::optional<int> parseInt(std::string_view text) noexcept;
+
+// A decimal number of seconds, perhaps with a fraction, up to a million; or nothing.
+[[nodiscard]] std::optional<std::chrono::milliseconds> parseSeconds(std::string_view text) noexcept;
 
 [[nodiscard]] std::string_view trim(std::string_view text) noexcept;
 [[nodiscard]] std::vector<std::string_view> split(std::string_view text, char separator);

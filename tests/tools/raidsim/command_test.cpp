@@ -131,6 +131,7 @@ TEST_F(CommandLine, HelpListsEveryCommandAndQuitQuits) {
               "join DRIVE-PATH ARRAY-OR-SPARES-PATH\n"
               "leave DRIVE-PATH ARRAY-OR-SPARES-PATH\n"
               "reload [FILE]\n"
+              "fault FILE [CASE] | off\n"
               "status\n"
               "help\n"
               "quit");

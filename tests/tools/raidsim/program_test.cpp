@@ -144,12 +144,19 @@ const std::vector<FailingStart> failingStarts{
      65},
     {{"--init", "failing.init", "system.xml"},
      "raidsim: failing.init: line 1: set: the document has no adapter:9\n",
+     65},
+    {{"--fault", "gone.fault", "system.xml"},
+     "raidsim: gone.fault: No such file or directory\n",
+     66},
+    {{"--fault", "bad.fault", "system.xml"},
+     "raidsim: bad.fault: line 2: unknown instruction \"explode\"\n",
      65}};
 
 TEST(Program, FailsToStartWithOneLineAndAStatus) {
     writeFile("system.xml", smallSystem());
     writeFile("open.xml", "<ac:system>");
     writeFile("bad.script", "status\nreboot\n");
+    writeFile("bad.fault", "title \"Bad\"\nexplode\n");
     writeFile("failing.init", "set adapter:9 state=4\n");
     for (const auto& [arguments, message, status] : failingStarts) {
         Program program(arguments);

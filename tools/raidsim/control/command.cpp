@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <array>
 #include <limits>
+#include <memory>
 #include <optional>
 #include <utility>
 
@@ -82,6 +83,25 @@ Command makeReload(const Words& words) {
     };
 }
 
+// `fault FILE [CASE]` or `fault off`
+Command makeFault(const Words& words) {
+    if (words.size() == 1 && words[0] == "off") {
+        return [](Service& service) {
+            service.faults().off();
+            return Outcome{"fault: off"};
+        };
+    }
+    const auto file = std::make_shared<const FaultFile>(words[0]);
+    const auto number = words.size() > 1 ? parseInt(words[1]) : std::nullopt;
+    if (words.size() > 1 && (!number || *number < 0))
+        throw CommandError("\"" + words[1] + "\" is not the number of a case");
+    return [file, number](Service& service) {
+        const auto only = number ? std::optional(static_cast<std::size_t>(*number)) : std::nullopt;
+        service.faults().arm(file, only);
+        return Outcome{"fault: armed " + file->name()};
+    };
+}
+
 Command makeStatus(const Words&) {
     return [](Service& service) {
         const EventLog& log = service.events();
@@ -107,13 +127,14 @@ struct Entry {
 
 constexpr std::size_t anyNumber = std::numeric_limits<std::size_t>::max();
 
-constexpr std::array<Entry, 9> commands{{
+constexpr std::array<Entry, 10> commands{{
     {"event", "field=value...", 1, anyNumber, makeEvent},
     {"set", "PATH field=value...", 2, anyNumber, makeSet},
     {"progress", "PATH PERCENT|done", 2, 2, makeProgress},
     {"join", "DRIVE-PATH ARRAY-OR-SPARES-PATH", 2, 2, makeMembership<join>},
     {"leave", "DRIVE-PATH ARRAY-OR-SPARES-PATH", 2, 2, makeMembership<leave>},
     {"reload", "[FILE]", 0, 1, makeReload},
+    {"fault", "FILE [CASE] | off", 1, 2, makeFault},
     {"status", "", 0, 0, makeStatus},
     {"help", "", 0, 0, makeHelp},
     {"quit", "", 0, 0, makeQuit},

@@ -1,7 +1,6 @@
 #include "control/scenario.h"
 
 #include <algorithm>
-#include <charconv>
 #include <utility>
 
 #include "text.h"
@@ -36,14 +35,10 @@ std::string_view takeWord(std::string_view& rest) {
 }
 
 std::chrono::milliseconds parseTime(std::string_view word) {
-    constexpr double longest = 1e6;
-    double seconds = 0;
-    const char* const end = word.data() + word.size();
-    const auto [stop, error] = std::from_chars(word.data(), end, seconds, std::chars_format::fixed);
-    // Written so that "nan" fails too.
-    if (error != std::errc{} || stop != end || !(seconds >= 0 && seconds <= longest))
+    const auto time = parseSeconds(word);
+    if (!time)
         throw CommandError("\"" + std::string(word) + "\" is not a time in seconds");
-    return std::chrono::round<std::chrono::milliseconds>(std::chrono::duration<double>(seconds));
+    return *time;
 }
 
 }  // namespace

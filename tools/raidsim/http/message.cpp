@@ -116,12 +116,15 @@ Parsed parse(std::string_view received) {
     return Refusal{405, "Only GET and POST are supported"};
 }
 
-std::string format(const Answer& answer) {
-    std::string out = "HTTP/1.1 " + std::to_string(answer.status) + ' ';
-    out.append(reasonOf(answer.status));
+std::string header(int status, std::string_view length) {
+    std::string out = "HTTP/1.1 " + std::to_string(status) + ' ';
+    out.append(reasonOf(status));
     out.append("\nContent-Type: application/soap+xml; charset=\"utf-8\"\nContent-Length: ");
-    out.append(std::to_string(answer.body.size())).append("\nConnection: close\n\n");
-    return out.append(answer.body);
+    return out.append(length).append("\nConnection: close\n\n");
+}
+
+std::string format(const Answer& answer) {
+    return header(answer.status, std::to_string(answer.body.size())).append(answer.body);
 }
 
 Answer fault(const Refusal& refusal) {

@@ -31,8 +31,11 @@ struct Answer {
     std::string body;
 };
 
-// The bytes of an answer: bare LF line ends, "Content-Length: " with a space, as clients
-// search for them.
+// The header of an answer: bare LF line ends, "Content-Length: " with a space, as clients search
+// for them.
+[[nodiscard]] std::string header(int status, std::string_view length);
+
+// The bytes of an answer.
 [[nodiscard]] std::string format(const Answer& answer);
 
 // The same bytes carrying a SOAP fault.

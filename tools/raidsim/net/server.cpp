@@ -2,6 +2,7 @@
 
 #include <utility>
 
+#include "net/fault_session.h"
 #include "net/session.h"
 
 namespace raidsim {
@@ -17,18 +18,23 @@ constexpr std::chrono::milliseconds acceptPause{100};
 }  // namespace
 
 Server::Server(boost::asio::io_context& context, Service& served, const ServerSettings& chosen)
-    : acceptor(context, tcp::endpoint(boost::asio::ip::address_v4::loopback(), chosen.port)),
+    : acceptor(context),
       pause(context),
       service(served),
-      settings(chosen) {
-    accept();
+      settings(chosen),
+      endpoint(boost::asio::ip::address_v4::loopback(), chosen.port) {
+    listen();
+    service.faults().changed = [this] { listenOrRefuse(); };
+    listenOrRefuse();
 }
 
-Server::~Server() { stop(); }
-
-std::uint16_t Server::port() const { return acceptor.local_endpoint().port(); }
+Server::~Server() {
+    service.faults().changed = [] {};
+    stop();
+}
 
 void Server::stop() {
+    stopped = true;
     error_code ignored;
     acceptor.close(ignored);
     pause.cancel();
@@ -38,13 +44,34 @@ void Server::stop() {
         session->close();
 }
 
+void Server::listen() {
+    acceptor.open(endpoint.protocol());
+    acceptor.set_option(tcp::acceptor::reuse_address(true));
+    acceptor.bind(endpoint);
+    acceptor.listen();
+    endpoint = acceptor.local_endpoint();
+    accept();
+}
+
+void Server::listenOrRefuse() {
+    const bool refuses = service.faults().refuses();
+    if (stopped || refuses != acceptor.is_open())
+        return;
+    if (refuses) {
+        acceptor.close();
+    } else {
+        listen();
+    }
+}
+
 void Server::accept() {
     acceptor.async_accept([this](error_code error, tcp::socket socket) {
         if (error == boost::asio::error::operation_aborted || !acceptor.is_open())
             return;
         if (!error) {
             admit(std::move(socket));
-            accept();
+            if (acceptor.is_open())
+                accept();
             return;
         }
         pause.expires_after(acceptPause);
@@ -56,16 +83,31 @@ void Server::accept() {
 }
 
 void Server::admit(tcp::socket socket) {
+    if (auto play = service.faults().meetConnection()) {
+        misbehave(std::move(socket), std::move(*play), service.goodBody(RequestKind::any));
+        return;
+    }
     const bool full = sessions.size() >= settings.clients;
-    auto session = std::make_shared<Session>(
+    const auto session = std::make_shared<Session>(
         std::move(socket), service, settings,
-        [this](const std::shared_ptr<Session>& closed) { sessions.erase(closed); });
+        [this](const std::shared_ptr<Client>& closed) { sessions.erase(closed); },
+        [this](tcp::socket taken, FaultDesk::Play play, std::string body) {
+            misbehave(std::move(taken), std::move(play), std::move(body));
+        });
     sessions.insert(session);
     if (full) {
         session->refuse({503, "Too many clients"});
     } else {
         session->start();
     }
+}
+
+void Server::misbehave(tcp::socket socket, FaultDesk::Play play, std::string body) {
+    const auto session = std::make_shared<FaultSession>(
+        std::move(socket), service.faults(), std::move(play), std::move(body),
+        [this](const std::shared_ptr<Client>& closed) { sessions.erase(closed); });
+    sessions.insert(session);
+    session->start();
 }
 
 }  // namespace raidsim

@@ -14,7 +14,7 @@
 
 namespace raidsim {
 
-class Session;
+class Client;
 
 struct ServerSettings {
     std::uint16_t port = 34572;
@@ -24,8 +24,8 @@ struct ServerSettings {
     std::chrono::milliseconds drainTime = bounds::drainTime;
 };
 
-// Accepts clients on 127.0.0.1 and gives each a Session. Everything runs on the thread of the
-// io_context, which must outlive the server; so must the service.
+// Accepts clients on 127.0.0.1 and gives each a Session, or the fault that is armed. Everything
+// runs on the thread of the io_context, which must outlive the server; so must the service.
 class Server {
 public:
     // Listens at once; throws boost::system::system_error when it cannot. Port 0 picks one.
@@ -34,21 +34,27 @@ public:
     Server(const Server&) = delete;
     Server& operator=(const Server&) = delete;
 
-    [[nodiscard]] std::uint16_t port() const;
+    [[nodiscard]] std::uint16_t port() const { return endpoint.port(); }
     [[nodiscard]] std::size_t clients() const noexcept { return sessions.size(); }
 
     // Stops listening and drops every client.
     void stop();
 
 private:
+    void listen();
     void accept();
     void admit(boost::asio::ip::tcp::socket socket);
+    void misbehave(boost::asio::ip::tcp::socket socket, FaultDesk::Play play, std::string body);
+    // While a fault says so, nobody listens.
+    void listenOrRefuse();
 
     boost::asio::ip::tcp::acceptor acceptor;
     boost::asio::steady_timer pause;
     Service& service;
     ServerSettings settings;
-    std::set<std::shared_ptr<Session>> sessions;
+    boost::asio::ip::tcp::endpoint endpoint;
+    bool stopped = false;
+    std::set<std::shared_ptr<Client>> sessions;
 };
 
 }  // namespace raidsim

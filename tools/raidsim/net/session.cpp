@@ -15,12 +15,14 @@ using boost::system::error_code;
 
 }  // namespace
 
-Session::Session(tcp::socket client, Service& served, const ServerSettings& chosen, Closed closed)
+Session::Session(tcp::socket client, Service& served, const ServerSettings& chosen, Closed closed,
+                 HandOver taker)
     : socket(std::move(client)),
       timer(socket.get_executor()),
       service(served),
       settings(chosen),
-      onClosed(std::move(closed)) {}
+      onClosed(std::move(closed)),
+      handOver(std::move(taker)) {}
 
 void Session::start() {
     limit(settings.requestTime);
@@ -88,7 +90,20 @@ void Session::ended() {
     }
 }
 
+bool Session::meetsFault(const http::Request& whole) {
+    const auto kind = Service::kindOf(whole);
+    auto play = kind ? service.faults().meetRequest(*kind) : std::nullopt;
+    if (!play)
+        return false;
+    auto taken = std::move(socket);
+    close();
+    handOver(std::move(taken), std::move(*play), service.goodBody(*kind));
+    return true;
+}
+
 void Session::handle(const http::Request& whole) {
+    if (meetsFault(whole))
+        return;
     Service::Reply reply = service.reply(whole);
     if (const auto* const ready = std::get_if<http::Answer>(&reply)) {
         answer(*ready);

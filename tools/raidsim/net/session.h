@@ -11,26 +11,28 @@
 #include <string>
 
 #include "http/message.h"
+#include "net/client.h"
 #include "net/server.h"
 #include "service.h"
 
 namespace raidsim {
 
 // One client: a request, perhaps a wait for an event, an answer, the end.
-class Session : public std::enable_shared_from_this<Session> {
+class Session : public Client, public std::enable_shared_from_this<Session> {
 public:
-    using Closed = std::function<void(const std::shared_ptr<Session>&)>;
+    // Takes the connection over, its request read, for a fault that met it.
+    using HandOver = std::function<void(boost::asio::ip::tcp::socket socket, FaultDesk::Play play,
+                                        std::string goodBody)>;
 
     Session(boost::asio::ip::tcp::socket client, Service& service, const ServerSettings& settings,
-            Closed closed);
+            Closed closed, HandOver handOver);
 
-    void start();
+    void start() override;
 
     // Answers without waiting for the request.
     void refuse(const http::Refusal& refusal);
 
-    // Idempotent; a wait is given up.
-    void close();
+    void close() override;
 
 private:
     enum class State { reading, waiting, answering, draining, closed };
@@ -39,6 +41,7 @@ private:
     void received(std::size_t count);
     void ended();
     void handle(const http::Request& request);
+    bool meetsFault(const http::Request& request);
     void answer(const http::Answer& answer);
     void answered();
     void limit(std::chrono::milliseconds time);
@@ -49,6 +52,7 @@ private:
     Service& service;
     const ServerSettings settings;
     Closed onClosed;
+    HandOver handOver;
     State state = State::reading;
     std::array<char, 4096> chunk{};
     std::string request;

@@ -1,0 +1,152 @@
+#include "host.h"
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <cstdio>
+#include <iterator>
+#include <map>
+#include <regex>
+
+#include "RAIDInstrumentation.h"
+#include "agent/agent_link.h"
+#include "agent/exchange.h"
+#include "flat/lists.h"
+#include "published_state.h"
+#include "support/blocked_call.h"
+#include "support/files.h"
+#include "support/socket.h"
+
+namespace raid::test {
+
+namespace {
+
+using raidsim::Fate;
+using raidsim::FaultOutcome;
+using raidsim::HostCall;
+
+// Every exchange prints a line on standard output, where nobody wants thousands of them.
+class QuietOutput {
+public:
+    QuietOutput() : before(dup(STDOUT_FILENO)) {
+        std::fflush(stdout);
+        const Socket null(open("/dev/null", O_WRONLY | O_CLOEXEC));
+        dup2(null.get(), STDOUT_FILENO);
+    }
+    QuietOutput(const QuietOutput&) = delete;
+    QuietOutput& operator=(const QuietOutput&) = delete;
+    ~QuietOutput() {
+        std::fflush(stdout);
+        dup2(before.get(), STDOUT_FILENO);
+    }
+
+private:
+    Socket before;
+};
+
+std::size_t entriesOf(const char* directory) {
+    const std::filesystem::directory_iterator entries(directory);
+    return static_cast<std::size_t>(std::distance(begin(entries), end(entries)));
+}
+
+void setLevel(int level) {
+    configRead = 1;
+    LOG_LEVEL = level;
+}
+
+// A call of a host, and what cancels it.
+struct Call {
+    int (*make)();
+    void (*cancel)();
+};
+
+const std::map<HostCall, Call> calls{
+    {HostCall::refresh,
+     {[] {
+          setRefreshFlag();
+          return getChannelCount();
+      },
+      disconnectSocket}},
+    {HostCall::getEvent,
+     {[] {
+          setRAIDEventSequenceNumber(1);
+          return getEvent();
+      },
+      cancelGetEvent}},
+    {HostCall::enableRAIDEvent, {enableRAIDEvent, disconnectSocket}},
+};
+
+}  // namespace
+
+Footprint Footprint::ofThisProcess() {
+    return {entriesOf("/proc/self/task"), entriesOf("/proc/self/fd")};
+}
+
+Host::Host(Simulator& served) : simulator(served) {
+    refreshGood();
+    published = publishedConfiguration();
+}
+
+void Host::refreshGood() {
+    const QuietOutput quiet;
+    setLevel(0);
+    setRefreshFlag();
+    (void)getChannelCount();
+}
+
+void Host::startGood() {
+    simulator.serveMarked();
+    refreshGood();
+    marked = publishedConfiguration();
+    simulator.serveUnmarked();
+    // A batch that lacks the first event: a fault's answer holds them all.
+    const QuietOutput quiet;
+    setRAIDEventSequenceNumber(2);
+    getEvent();
+    eventsBefore = getRAIDEventCount();
+}
+
+int Host::call(const FaultOutcome& outcome, int level) {
+    const QuietOutput quiet;
+    std::filesystem::remove(logPath);
+    setLevel(level);
+    const Call& wanted = calls.at(outcome.call);
+    int result = 0;
+    if (outcome.cancels) {
+        BlockedCall blocked(wanted.make);
+        simulator.waitForStall();
+        wanted.cancel();
+        result = blocked.interrupt();
+    } else {
+        result = wanted.make();
+    }
+    setLevel(0);
+    return result;
+}
+
+Fate Host::configuration() const {
+    const bool listsKept = publishedConfiguration() == marked;
+    if (raidSystem == nullptr) {
+        return listsKept ? Fate::lost : Fate::unsaid;
+    }
+    return listsKept ? Fate::kept : Fate::replaced;
+}
+
+Fate Host::events() const {
+    if (raidEvents == nullptr) {
+        return Fate::lost;
+    }
+    return getRAIDEventCount() == eventsBefore ? Fate::kept : Fate::replaced;
+}
+
+std::string Host::log() {
+    static const std::regex handle("Socket handle=[0-9]+");
+    return std::regex_replace(readLog(), handle, "Socket handle=#");
+}
+
+bool Host::isGoodAgain() {
+    refreshGood();
+    return raidSystem != nullptr && publishedConfiguration() == published;
+}
+
+}  // namespace raid::test

@@ -1,0 +1,49 @@
+#pragma once
+
+#include <cstddef>
+#include <filesystem>
+#include <string>
+
+#include "fault/fault.h"
+#include "simulator.h"
+
+namespace raid::test {
+
+// What is counted of the process before and after a fault.
+struct Footprint {
+    std::size_t threads;
+    std::size_t descriptors;
+
+    [[nodiscard]] static Footprint ofThisProcess();
+};
+
+// The library in this process, with a configuration and a batch of events that were good.
+class Host {
+public:
+    explicit Host(Simulator& served);
+
+    // Reads and publishes both anew, other ones than the service then has, so that it shows whether
+    // they are replaced.
+    void startGood();
+
+    // Makes the call at this log level, and cancels it once the service stalls if the case says so.
+    // Returns the call's result.
+    int call(const raidsim::FaultOutcome& outcome, int level);
+
+    [[nodiscard]] raidsim::Fate configuration() const;
+    [[nodiscard]] raidsim::Fate events() const;
+    // The log of the last call; the number of the socket's descriptor is left out.
+    [[nodiscard]] static std::string log();
+    // Whether a good answer publishes what it did at first.
+    [[nodiscard]] bool isGoodAgain();
+
+private:
+    static void refreshGood();
+
+    Simulator& simulator;
+    std::string published;
+    std::string marked;  // the same with the mark
+    int eventsBefore = 0;
+};
+
+}  // namespace raid::test
