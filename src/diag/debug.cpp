@@ -1,7 +1,6 @@
 #include "diag/debug.h"
 
 #include <fcntl.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <array>
@@ -9,7 +8,6 @@
 #include <cstdio>
 #include <memory>
 #include <string>
-#include <string_view>
 
 #include "base/defer_cancellation.h"
 #include "base/file_descriptor.h"
@@ -25,38 +23,23 @@ struct CloseFile {
 using File = std::unique_ptr<std::FILE, CloseFile>;
 
 /// Opened anew for every message, so that the log can be moved or removed under a running host.
-raid::base::FileDescriptor openLog() noexcept {
-    constexpr int mode = O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC;
+/// O_NONBLOCK matters for a pipe only: one that nobody reads would otherwise hold the host up.
+File openLog() noexcept {
+    constexpr int mode = O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC | O_NONBLOCK;
     constexpr mode_t everybody = 0666;  // less what the host's mask takes
-    return raid::base::FileDescriptor(raid::base::repeatOnSignal(
+    raid::base::FileDescriptor descriptor(raid::base::repeatOnSignal(
         [] { return ::open("../logs/RAIDInstrumentation.log", mode, everybody); }));
-}
-
-/// The write function of a stream that stands for a descriptor. The stream of an opened file gives
-/// up at a signal and loses the rest of the message where the log is a pipe or a terminal.
-ssize_t writeWhole(void* descriptor, const char* bytes, std::size_t size) noexcept {
-    const int log = static_cast<const raid::base::FileDescriptor*>(descriptor)->get();
-    std::string_view rest(bytes, size);
-    while (!rest.empty()) {
-        const auto count =
-            raid::base::repeatOnSignal([&] { return ::write(log, rest.data(), rest.size()); });
-        if (count <= 0) {
-            break;
-        }
-        rest.remove_prefix(static_cast<std::size_t>(count));
+    File log(descriptor.get() < 0 ? nullptr : ::fdopen(descriptor.get(), "a+"));
+    if (log) {
+        descriptor.release();
     }
-    return static_cast<ssize_t>(size - rest.size());
+    return log;
 }
 
 void append(const char* message) {
     const raid::base::DeferCancellation deferred;
-    auto log = openLog();
-    if (log.get() < 0) {
-        return;
-    }
-    const File stream(::fopencookie(&log, "a", {nullptr, writeWhole, nullptr, nullptr}));
-    if (stream) {
-        raid::diag::printWithZeros(stream.get(), message);
+    if (const File log = openLog()) {
+        raid::diag::printWithZeros(log.get(), message);
     }
 }
 

@@ -1,7 +1,6 @@
 // Answers read from files.
 
 #include <gtest/gtest.h>
-#include <sys/stat.h>
 
 #include <filesystem>
 #include <string>
@@ -85,7 +84,7 @@ struct Unreadable : Row {
 const std::vector<Unreadable> unreadables{
     {"MissingFile", [](const char*) {}},
     {"Directory", [](const char* path) { std::filesystem::create_directory(path); }},
-    {"PipeWithoutAWriter", [](const char* path) { ASSERT_EQ(mkfifo(path, 0600), 0); }},
+    {"PipeWithoutAWriter", [](const char* path) { makePipe(path); }},
     {"LinkToNothing", [](const char* path) { std::filesystem::create_symlink("nothing", path); }},
     {"LinkToItself", [](const char* path) { std::filesystem::create_symlink(path, path); }},
 };

@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 #include <pthread.h>
 #include <sys/resource.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
 #include <climits>
@@ -100,7 +99,7 @@ TEST(RegularFile, RefusesEverythingElseWithoutWaiting) {
     EXPECT_FALSE(RegularFile::open("missing"));
     EXPECT_FALSE(RegularFile::open("."));
     EXPECT_FALSE(RegularFile::open("/dev/null"));
-    ASSERT_EQ(mkfifo("pipe", 0600), 0);
+    makePipe("pipe");
     EXPECT_FALSE(RegularFile::open("pipe"));
 }
 

@@ -3,7 +3,6 @@
 #include "diag/debug.h"
 
 #include <gtest/gtest.h>
-#include <sys/stat.h>
 
 #include <filesystem>
 #include <string>
@@ -102,7 +101,7 @@ TEST_F(DebugLog, StaysAtLevel0WithSettingsThatCannotBeRead) {
     fs::create_directory(settingsPath);
     expectLevel0();
     fs::remove(settingsPath);
-    ASSERT_EQ(mkfifo(std::string(settingsPath).c_str(), 0600), 0);
+    makePipe(settingsPath);
     expectLevel0();
 }
 

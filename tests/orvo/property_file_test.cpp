@@ -71,7 +71,7 @@ TEST(PropertyFile, ThrowsForWhatIsNoReadableFile) {
     ASSERT_EQ(mkdir(path, 0700), 0);
     expectUnreadable();
     ASSERT_EQ(rmdir(path), 0);
-    ASSERT_EQ(mkfifo(path, 0600), 0);
+    makePipe(path);
     expectUnreadable();
 }
 

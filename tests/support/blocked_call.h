@@ -28,15 +28,26 @@ public:
     // The same, and breaks the system calls that the thread waits in by signals, so that it looks
     // at its flags at once. A signal can come before the wait begins: it is repeated.
     Result interrupt() {
+        constexpr std::chrono::milliseconds pause{2};
+        while (!returnsWithin(pause)) {
+            nudge();
+        }
+        return result.get();
+    }
+
+    // One such signal; the call must not have returned, or its result not have been taken.
+    void nudge() {
         struct sigaction ignoring {};
         ignoring.sa_handler = [](int) {};
         ignoring.sa_flags = SA_RESTART;
         sigaction(SIGUSR1, &ignoring, nullptr);
-        constexpr std::chrono::milliseconds pause{2};
-        while (result.wait_for(pause) != std::future_status::ready) {
-            pthread_kill(thread.native_handle(), SIGUSR1);
-        }
-        return result.get();
+        pthread_kill(thread.native_handle(), SIGUSR1);
+    }
+
+    // Waits for the end of the call, but no longer than that.
+    template <class Time>
+    [[nodiscard]] bool returnsWithin(Time time) const {
+        return result.wait_for(time) == std::future_status::ready;
     }
 
 private:

@@ -1,8 +1,12 @@
 #include "support/files.h"
 
+#include <sys/stat.h>
+
 #include <fstream>
 #include <iterator>
 #include <stdexcept>
+
+#include "support/socket.h"
 
 namespace raid::test {
 
@@ -12,6 +16,10 @@ void writeFile(const std::filesystem::path& path, std::string_view bytes) {
     if (!file) {
         throw std::runtime_error("cannot write " + path.string());
     }
+}
+
+void makePipe(const std::filesystem::path& path) {
+    throwIfNegative(mkfifo(path.c_str(), 0600), "make the pipe " + path.string());
 }
 
 std::string readFile(const std::filesystem::path& path) {

@@ -11,6 +11,8 @@ inline constexpr std::string_view settingsPath = "../logs/RAIDInstrumentation.in
 inline constexpr std::string_view logPath = "../logs/RAIDInstrumentation.log";
 
 void writeFile(const std::filesystem::path& path, std::string_view bytes);
+// A pipe without a reader or a writer.
+void makePipe(const std::filesystem::path& path);
 // Throws when the file cannot be read.
 [[nodiscard]] std::string readFile(const std::filesystem::path& path);
 
