@@ -10,6 +10,7 @@ function(raid_add_test)
     add_executable(${arg_NAME} ${arg_SOURCES})
     target_link_libraries(${arg_NAME} PRIVATE raid_gtest_main raid::warnings ${arg_LIBRARIES})
     target_compile_definitions(${arg_NAME} PRIVATE ${arg_DEFINITIONS})
+    target_precompile_headers(${arg_NAME} REUSE_FROM raid_gtest_main)
     set_target_properties(${arg_NAME} PROPERTIES
         RUNTIME_OUTPUT_DIRECTORY "${PROJECT_BINARY_DIR}/tests/bin")
     gtest_discover_tests(${arg_NAME} DISCOVERY_MODE PRE_TEST DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 120)

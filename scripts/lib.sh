@@ -8,7 +8,11 @@ jobs=$(nproc)
 buildPackages=(cmake g++ libboost-dev libcli11-dev ninja-build nlohmann-json3-dev)
 testPackages=(g++-multilib googletest pkgconf)
 checkPackages=(clang clang-format clang-tidy shellcheck)
+abiPackages=(abigail-tools)
+coveragePackages=(gcovr)
 fuzzPackages=(clang libclang-rt-14-dev libxml2-dev)
+mutationPackages=(python3)
+valgrindPackages=(libc6-dbg valgrind)
 
 say() { printf '%s\n' "$@"; }
 

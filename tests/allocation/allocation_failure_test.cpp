@@ -162,6 +162,17 @@ const std::vector<Subject> subjects{
          ASSERT_TRUE(nextSequenceNumber == newestEvent || (!threw && nextSequenceNumber == -1))
              << nextSequenceNumber;
      }},
+    {{"enableRAIDEventWithTheFirstMessage"},
+     [] { setRAIDEventSequenceNumber(firstEvent); },
+     [] {
+         configRead = 0;
+         enableRAIDEvent();
+     },
+     [] { ASSERT_EQ(nextSequenceNumber, newestEvent); },
+     [](bool /*threw*/) {
+         ASSERT_TRUE(nextSequenceNumber == newestEvent || nextSequenceNumber == -1)
+             << nextSequenceNumber;
+     }},
     {{"readRAIDXML"},
      [] {},
      [] { readRAIDXML(savedConfiguration); },

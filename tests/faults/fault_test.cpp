@@ -27,7 +27,7 @@ using raidsim::FaultOutcome;
 using raidsim::LogExpectation;
 
 // How many cases of one file run in one test.
-constexpr std::size_t casesAtOnce = 4000;
+constexpr std::size_t casesAtOnce = 2000;
 
 // Some cases of a file.
 struct Portion {
@@ -118,7 +118,7 @@ class FaultScripts : public FreshLibrary, public testing::WithParamInterface<Por
 protected:
     void meet(std::size_t number, const FaultCase& chosen, int level) {
         const FaultOutcome& outcome = chosen.outcome;
-        host.startGood();
+        host.startGood(outcome);
         const auto before = Footprint::ofThisProcess();
         simulator.arm(GetParam().path, number);
         int result = 0;

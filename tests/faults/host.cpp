@@ -83,8 +83,15 @@ Footprint Footprint::ofThisProcess() {
 }
 
 Host::Host(Simulator& served) : simulator(served) {
+    simulator.serveMarked();
+    refreshGood();
+    marked = publishedConfiguration();
+    markedSystem = std::make_unique<RAIDSystem>(*raidSystem);
+    markedChannels = ChannelList;
+    simulator.serveUnmarked();
     refreshGood();
     published = publishedConfiguration();
+    markEvents();
 }
 
 void Host::refreshGood() {
@@ -94,16 +101,20 @@ void Host::refreshGood() {
     (void)getChannelCount();
 }
 
-void Host::startGood() {
-    simulator.serveMarked();
-    refreshGood();
-    marked = publishedConfiguration();
-    simulator.serveUnmarked();
-    // A batch that lacks the first event: a fault's answer holds them all.
+// A batch that lacks the first event: a fault's answer holds them all.
+void Host::markEvents() {
     const QuietOutput quiet;
     setRAIDEventSequenceNumber(2);
     getEvent();
     eventsBefore = getRAIDEventCount();
+}
+
+void Host::startGood(const FaultOutcome& outcome) {
+    *raidSystem = *markedSystem;
+    ChannelList = markedChannels;
+    if (outcome.events != Fate::unsaid) {
+        markEvents();
+    }
 }
 
 int Host::call(const FaultOutcome& outcome, int level) {

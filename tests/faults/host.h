@@ -2,9 +2,12 @@
 
 #include <cstddef>
 #include <filesystem>
+#include <memory>
 #include <string>
+#include <vector>
 
 #include "fault/fault.h"
+#include "model/system_and_adapter.h"
 #include "simulator.h"
 
 namespace raid::test {
@@ -22,9 +25,9 @@ class Host {
 public:
     explicit Host(Simulator& served);
 
-    // Reads and publishes both anew, other ones than the service then has, so that it shows whether
-    // they are replaced.
-    void startGood();
+    // Begins with a good configuration, and good events, that are not quite what the service has,
+    // so that it shows whether the case replaces them.
+    void startGood(const raidsim::FaultOutcome& outcome);
 
     // Makes the call at this log level, and cancels it once the service stalls if the case says so.
     // Returns the call's result.
@@ -39,10 +42,13 @@ public:
 
 private:
     static void refreshGood();
+    void markEvents();
 
     Simulator& simulator;
     std::string published;
-    std::string marked;  // the same with the mark
+    std::string marked;  // the same with another speed of a channel
+    std::unique_ptr<RAIDSystem> markedSystem;
+    std::vector<RAIDChannel> markedChannels;
     int eventsBefore = 0;
 };
 

@@ -20,6 +20,8 @@ struct Field {
 
 // What became of reading one element.
 struct Reading {
+    [[nodiscard]] bool operator==(const Reading&) const = default;
+
     std::string error = {};  // message, or empty
     int consumed = 0;
     std::string type = {};                 // of the "xsi:type" attribute
@@ -47,6 +49,8 @@ struct ModelClass : Row {
     std::vector<Inside> inside;
     std::vector<std::string> unshown;  // children that are known and that no getter shows
     std::function<Reading(const std::string& text)> read;
+    // Reads a good element, and shows it and its copies.
+    std::function<std::vector<Reading>(const std::string& text)> readAsValues;
 
     [[nodiscard]] std::string missing(std::string_view word, std::string_view found) const;
     [[nodiscard]] std::string unknown(std::string_view found) const;

@@ -24,6 +24,7 @@ public:
         : described(name, element, endWord) {
         getters() = {.type = type, .fields = {}, .inside = {}};
         described.read = [](const std::string& text) { return reading(text); };
+        described.readAsValues = [](const std::string& text) { return readingAsValues(text); };
     }
 
     Describe& number(const char* name, int (Model::*getter)() const) {
@@ -85,6 +86,9 @@ public:
     // What the getters show of an object.
     static Reading shownBy(const Model& model) {
         Reading result;
+        if constexpr (requires { model.dump(); }) {
+            model.dump();  // shows nothing
+        }
         if (getters().type != nullptr) {
             result.type = (model.*getters().type)();
         }
@@ -129,6 +133,22 @@ private:
         } catch (const RAIDXMLError& error) {
             return {.error = error.getMessage()};
         }
+    }
+
+    // The same object again and again, each time made from the one before it in another way.
+    static std::vector<Reading> readingAsValues(const std::string& text) {
+        Model model(text.data(), static_cast<int>(text.size()), nullptr);
+        std::vector<Reading> all{shownBy(model)};
+        Model copied(model);
+        all.push_back(shownBy(copied));
+        Model moved(std::move(copied));
+        all.push_back(shownBy(moved));
+        copied = moved;
+        all.push_back(shownBy(copied));
+        moved = std::move(copied);
+        all.push_back(shownBy(moved));
+        all.push_back(shownBy(model));
+        return all;
     }
 
     ModelClass described;

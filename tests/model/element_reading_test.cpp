@@ -62,6 +62,16 @@ TEST_P(ElementReading, GivesEachChildToItsFieldAndNoOther) {
     }
 }
 
+TEST_P(ElementReading, MakesAValueWhoseCopiesShowTheSame) {
+    std::string content;
+    for (const auto& field : model.fields) {
+        content += element("as:" + field.name, sample(field).first);
+    }
+    const auto readings = model.readAsValues(element(model.element, content, "o:Type"));
+    EXPECT_EQ(readings.front().type, "o:Type");
+    EXPECT_EQ(readings, std::vector(readings.size(), readings.front()));
+}
+
 TEST_P(ElementReading, KeepsAFieldWhoseElementIsEmptyEitherWay) {
     for (std::size_t i = 0; i < model.fields.size(); ++i) {
         const auto tag = "as:" + model.fields[i].name;

@@ -152,16 +152,19 @@ TEST_F(TokenizerBounds, DoNotLimitNamesTextsAndAttributes) {
     EXPECT_EQ(parse(many + ">").attributes.size(), 100000U);
 }
 
-TEST_F(TokenizerBounds, LetUnitsBeCopiedWhole) {
+TEST_F(TokenizerBounds, LetUnitsBeCopiedAndMovedWhole) {
     const auto unit = parse("<a b='1' c='2'/>");
-    auto copy = parse("text<");
-    copy = unit;
-    EXPECT_EQ(copy.kind, 1);
-    EXPECT_EQ(copy.name, "a");
-    EXPECT_EQ(copy.attributes, Attributes({{"b", "1"}, {"c", "2"}}));
-    EXPECT_TRUE(copy.opening);
-    EXPECT_TRUE(copy.closing);
-    EXPECT_EQ(copy.consumed, 16);
+    auto copied = unit;
+    auto moved = std::move(copied);
+    copied = moved;
+    moved = parse("text<");
+    moved = std::move(copied);
+    EXPECT_EQ(moved.kind, 1);
+    EXPECT_EQ(moved.name, "a");
+    EXPECT_EQ(moved.attributes, Attributes({{"b", "1"}, {"c", "2"}}));
+    EXPECT_TRUE(moved.opening);
+    EXPECT_TRUE(moved.closing);
+    EXPECT_EQ(moved.consumed, 16);
 }
 
 TEST(Space, IsEveryByteUpTo32From127To160And255) {

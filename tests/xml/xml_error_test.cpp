@@ -11,6 +11,15 @@ TEST(XMLError, BeginsItsTextWithWhatItIs) {
     EXPECT_EQ(RAIDXMLError("").getMessage(), "XML syntax error: ");
 }
 
+TEST(XMLError, IsAValue) {
+    const RAIDXMLError error("what");
+    const RAIDXMLError copied(error);
+    EXPECT_EQ(copied.getMessage(), error.getMessage());
+    RAIDXMLError assigned("else");
+    assigned = error;
+    EXPECT_EQ(assigned.getMessage(), error.getMessage());
+}
+
 TEST(XMLError, GathersContextFromTheInsideOut) {
     std::string message;
     try {

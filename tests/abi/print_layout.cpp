@@ -1,0 +1,5 @@
+#include <iostream>
+
+#include "layout.h"
+
+int main() { std::cout << raid::test::layoutOfTheModelClasses(); }
