@@ -1,8 +1,8 @@
 // Lets the library read a configuration and publish it, from the answer to the twelve lists.
 
-#include <array>
 #include <vector>
 
+#include "../tests/support/inventory_lists.h"
 #include "RAIDInstrumentation.h"
 #include "agent/agent_link.h"
 #include "flat/lists.h"
@@ -15,11 +15,10 @@ namespace {
 
 using namespace raid;
 
-std::array<std::size_t, 12> sizes() {
-    return {PellionAdapterList.size(),   LSIAdapterList.size(),      VantryAdapterList.size(),
-            ChannelList.size(),          RAIDArrayList.size(),       SpannedRAIDArrayList.size(),
-            RAIDLogicalDriveList.size(), RAIDDiskDriveList.size(),   RAIDEnclosureDeviceList.size(),
-            RAIDFanList.size(),          RAIDPowerSupplyList.size(), RAIDTempSensorList.size()};
+std::vector<std::size_t> sizes() {
+    std::vector<std::size_t> all;
+    test::forEachInventoryList([&](const auto& list) { all.push_back(list.size()); });
+    return all;
 }
 
 /// Reads what was published as a host does, with a buffer as large as the answer.

@@ -5,11 +5,13 @@ root=$(cd "$(dirname "${BASH_SOURCE[0]}")/.." && pwd)
 cd "$root" || exit
 
 jobs=$(nproc)
+# Python leaves no compiled files in the tree.
+export PYTHONDONTWRITEBYTECODE=1
 buildPackages=(cmake g++ libboost-dev libcli11-dev ninja-build nlohmann-json3-dev)
 testPackages=(g++-multilib googletest pkgconf)
 checkPackages=(clang clang-format clang-tidy shellcheck)
 abiPackages=(abigail-tools)
-coveragePackages=(gcovr)
+coveragePackages=(gcovr python3)
 fuzzPackages=(clang libclang-rt-14-dev libxml2-dev)
 mutationPackages=(python3)
 valgrindPackages=(libc6-dbg valgrind)
@@ -33,7 +35,7 @@ quietly() {
 }
 
 isInstalled() {
-    [[ $(dpkg-query --show --showformat='${db:Status-Status}' "$1" 2>/dev/null) == installed ]]
+    [[ $(dpkg-query --show --showformat='${db:Status-Status}' "$1" 2>/dev/null) == installed* ]]
 }
 
 # Installs what is missing of the packages named, or says what that is where it may not.

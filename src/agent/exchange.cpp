@@ -57,7 +57,8 @@ std::size_t contentLength(std::string_view digits) {
 std::optional<std::size_t> receiveRest(const base::StreamSocket& socket, std::span<char> body,
                                        std::size_t held) {
     while (held < body.size()) {
-        if (!waitForData(socket)) {
+        // A service that sends a little now and then must not outlast a cancel.
+        if (base::load(endFlag) != 0 || !waitForData(socket)) {
             return std::nullopt;
         }
         const auto count = socket.receive(body.subspan(held));
@@ -88,7 +89,9 @@ Document receiveBody(const base::StreamSocket& socket, const FirstChunk& chunk) 
     const std::span body(document.get(), length);
     const auto kept = first->first(std::min(first->size(), length));
     std::ranges::copy(kept, body.begin());
-    log(agentLinkLevel, "remaining data: %d\n", static_cast<int>(length - kept.size()));
+    // Of what came too much nothing is kept, but the log counts it.
+    log(agentLinkLevel, "remaining data: %d\n",
+        static_cast<int>(length) - static_cast<int>(first->size()));
     const auto held = receiveRest(socket, body, kept.size());
     if (!held) {
         return nullptr;

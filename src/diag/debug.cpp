@@ -60,20 +60,19 @@ void log(int level, const char* format, ...) {
     std::array<char, 256> line{};
     std::va_list arguments;
     va_start(arguments, format);
-    std::va_list again;
-    va_copy(again, arguments);
     const auto size = static_cast<std::size_t>(
         std::max(std::vsnprintf(line.data(), line.size(), format, arguments), 0));
     va_end(arguments);
     if (size < line.size()) {
         debug(level, line.data());
-    } else {
-        // Names and texts of the service's documents have any length.
-        std::string message(size, '\0');
-        std::vsnprintf(message.data(), size + 1, format, again);
-        debug(level, message.c_str());
+        return;
     }
-    va_end(again);
+    // Names and texts of the service's documents have any length.
+    std::string message(size, '\0');
+    va_start(arguments, format);
+    std::vsnprintf(message.data(), size + 1, format, arguments);
+    va_end(arguments);
+    debug(level, message.c_str());
 }
 
 }  // namespace raid::diag

@@ -172,9 +172,10 @@ void tracedReading(Model& model, Read read) {
     traceLine(words.exit);
 }
 
+/// What the parent has looked at to choose this reader, the reader reads for itself.
 template <class Model>
 void readElement(Model& model, UnitReader& units, const Unit& start) {
-    tracedReading(model, [&] { readContent(model, units, start); });
+    tracedReading(model, [&] { readContent(model, units, units.again(start)); });
 }
 
 /// What a public reading constructor does: reads the element that the text begins with and reports

@@ -109,6 +109,16 @@ public:
         return unit;
     }
 
+    /// The unit that was read last once more, which shows in the trace alone.
+    Unit again(const Unit& last) {
+        if (!diag::passes(diag::readingLevel)) {
+            return last;
+        }
+        at -= last.consumed;
+        left += last.consumed;
+        return next();
+    }
+
     [[nodiscard]] int consumed() const noexcept { return static_cast<int>(at - start); }
     [[nodiscard]] const char* position() const noexcept { return at; }
     [[nodiscard]] int remaining() const noexcept { return left; }

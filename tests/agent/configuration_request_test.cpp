@@ -9,6 +9,7 @@
 #include "support/blocked_call.h"
 #include "support/files.h"
 #include "support/fresh_library.h"
+#include "support/lock.h"
 #include "support/scripted_service.h"
 
 namespace {
@@ -16,18 +17,6 @@ namespace {
 using namespace raid::test;
 
 class ConfigurationRequest : public FreshLibrary {};
-
-// Whether another thread could take the lock.
-bool isFree(pthread_mutex_t& mutex) {
-    bool free = false;
-    std::jthread([&] {
-        free = pthread_mutex_trylock(&mutex) == 0;
-        if (free) {
-            pthread_mutex_unlock(&mutex);
-        }
-    }).join();
-    return free;
-}
 
 TEST_F(ConfigurationRequest, ReadsTheAnswerIntoTheSystem) {
     const ScriptedService service({answering(systemNamed("host"))});

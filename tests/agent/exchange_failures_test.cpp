@@ -96,6 +96,17 @@ TEST_F(ExchangeFailures, CanBeCancelledWhenTheServiceStallsInTheMiddleOfTheBody)
     service.waitFor(0, Stage::ended);  // unlike in the wait before, the socket was closed
 }
 
+TEST_F(ExchangeFailures, CanBeCancelledWhileTheServiceSendsAByteNowAndThen) {
+    std::vector<Piece> drops(100'000, "b");
+    drops.front().bytes = "Content-Length: 100000\n\nb";
+    const ScriptedService service({{.pieces = drops, .end = End::hold}});
+    BlockedCall blocked([] { return exchanged(); });
+    while (!blocked.returnsWithin(std::chrono::milliseconds(1))) {
+        disconnectSocket();
+    }
+    EXPECT_EQ(blocked.wait(), std::nullopt);
+}
+
 TEST_F(ExchangeFailures, DoNotComeFromDescriptorsAboveThoseOfADescriptorSet) {
     constexpr int most = FD_SETSIZE;
     const Limit descriptors(RLIMIT_NOFILE, 2 * most);

@@ -78,6 +78,18 @@ INSTANTIATE_TEST_SUITE_P(Answers, ExchangeFraming, testing::ValuesIn(framings), 
 
 class Exchange : public FreshLibrary {};
 
+TEST_F(Exchange, EndsTheLengthAtTheFirstByteThatIsNoDigit) {
+    for (int byte = 1; byte < 256; ++byte) {
+        const char c = static_cast<char>(byte);
+        if (c < '0' || c > '9') {
+            // A tenth digit would make it no length.
+            const ScriptedService service(
+                {{.pieces = {header(std::string("000000004") + c) + "body"}}});
+            EXPECT_EQ(exchanged(), c == '\n' ? "\nbod" : "body") << byte;
+        }
+    }
+}
+
 TEST_F(Exchange, MakesNoFurtherReceiveWhenTheWholeBodyCameInTheFirstChunk) {
     // The service neither sends more nor closes: another receive would block.
     const ScriptedService service({{.pieces = {answer("body")}, .end = End::hold}});

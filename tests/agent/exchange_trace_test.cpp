@@ -47,11 +47,11 @@ const std::vector<Trace> traces{
     {"OfABodyLongerThanAnnounced",
      {head + "<body>!"},
      "Data received 31\n" + head + "<body>!" +
-         "Content_Length: 6\nremaining data: 0\nReturn from getSOPEData\n"},
+         "Content_Length: 6\nremaining data: -1\nReturn from getSOPEData\n"},
     {"OfTenDigits",
      {"Content-Length: 0000000006\n\n<body>"},
      "Data received 34\nContent-Length: 0000000006\n\n<body>"
-     "remaining data: 0\nReturn from getSOPEData\n"},
+     "remaining data: -6\nReturn from getSOPEData\n"},
     {"WithoutAHeaderEnd",
      {"Content-Length: 6\n"},
      "Data received 18\nContent-Length: 6\nContent_Length: 6\nReturn from getSOPEData\n"},
@@ -60,7 +60,7 @@ const std::vector<Trace> traces{
     {"OfConversionsInTheAnswer",
      {"Content-Length: 0\n\n100%% %d %s %n"},
      "Data received 33\nContent-Length: 0\n\n100% 0 %s %n"
-     "Content_Length: 0\nremaining data: 0\nReturn from getSOPEData\n"},
+     "Content_Length: 0\nremaining data: -14\nReturn from getSOPEData\n"},
 };
 
 class ExchangeTrace : public FreshLibrary, public testing::WithParamInterface<Trace> {};

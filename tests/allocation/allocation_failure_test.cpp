@@ -22,6 +22,8 @@
 #include "support/answering_service.h"
 #include "support/files.h"
 #include "support/fresh_library.h"
+#include "support/inventory_lists.h"
+#include "support/lock.h"
 #include "support/row.h"
 
 namespace {
@@ -36,22 +38,11 @@ constexpr int newestEvent = 77;
 constexpr const char* savedConfiguration = "./saved-answer-of-the-configuration.xml";
 constexpr const char* savedEvents = "./saved-answer-of-the-events.xml";
 
-auto inventory() {
-    return std::tie(PellionAdapterList, LSIAdapterList, VantryAdapterList, ChannelList,
-                    RAIDArrayList, SpannedRAIDArrayList, RAIDLogicalDriveList, RAIDDiskDriveList,
-                    RAIDEnclosureDeviceList, RAIDFanList, RAIDPowerSupplyList, RAIDTempSensorList);
-}
-
-template <class Action>
-void eachList(Action action) {
-    std::apply([&](auto&... lists) { (action(lists), ...); }, inventory());
-}
-
 using Sizes = std::vector<std::size_t>;
 
 Sizes inventorySizes() {
     Sizes sizes;
-    eachList([&](const auto& list) { sizes.push_back(list.size()); });
+    forEachInventoryList([&](const auto& list) { sizes.push_back(list.size()); });
     return sizes;
 }
 
@@ -64,17 +55,6 @@ constexpr auto mark = [](auto& list) {
     }
 };
 
-bool isFree(pthread_mutex_t& mutex) {
-    bool locked = false;
-    std::thread([&] {
-        locked = pthread_mutex_trylock(&mutex) == 0;
-        if (locked) {
-            pthread_mutex_unlock(&mutex);
-        }
-    }).join();
-    return locked;
-}
-
 // A call, and what must hold around it.
 struct Subject : Row {
     void (*prepare)();                     // so that the call has to make all its allocations
@@ -85,7 +65,7 @@ struct Subject : Row {
     std::string example = "small-server.xml";
 };
 
-void forgetInventory() { eachList(release); }
+void forgetInventory() { forEachInventoryList(release); }
 
 Sizes wholeInventory;
 Sizes markedInventory;
@@ -232,7 +212,7 @@ protected:
     bool failAt(long number) const {
         {
             const FailingHeap heap(Failing::never, 0);
-            eachList(mark);
+            forEachInventoryList(mark);
             mark(RAIDEventList);
         }
         markedInventory = inventorySizes();

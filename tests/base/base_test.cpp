@@ -52,6 +52,17 @@ TEST(DecimalNumber, IsReadFromTheFrontOfTheTextAndClamped) {
     }
 }
 
+TEST(DecimalNumber, IsPrecededByNothingButSpaceAndASign) {
+    constexpr std::string_view passedOver = " \t\n\v\f\r+0123456789-";
+    for (int byte = 0; byte < 256; ++byte) {
+        const char c = static_cast<char>(byte);
+        if (passedOver.find(c) == std::string_view::npos) {
+            EXPECT_EQ(decimalNumber(std::string{c, '5'}), 0) << byte;
+            EXPECT_EQ(decimalNumber(std::string{'5', c, '5'}), 5) << byte;
+        }
+    }
+}
+
 bool isOpen(int descriptor) { return fcntl(descriptor, F_GETFD) != -1; }
 
 int openNull() { return open("/dev/null", O_RDONLY | O_CLOEXEC); }

@@ -14,6 +14,7 @@
 #include "flat/exported.h"
 #include "host.h"
 #include "support/fresh_library.h"
+#include "support/lock.h"
 #include "support/open_descriptors.h"
 #include "support/row.h"
 
@@ -171,8 +172,7 @@ private:
         EXPECT_EQ(after.descriptors,
                   before.descriptors + static_cast<std::size_t>(outcome.leftOpen));
         leftOpen += outcome.leftOpen;
-        EXPECT_EQ(pthread_mutex_trylock(&mutex_handle), 0);
-        pthread_mutex_unlock(&mutex_handle);
+        EXPECT_TRUE(isFree(mutex_handle));
         EXPECT_TRUE(host.isGoodAgain()) << "the next good answer is not published";
     }
 

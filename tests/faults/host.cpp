@@ -15,6 +15,7 @@
 #include "published_state.h"
 #include "support/blocked_call.h"
 #include "support/files.h"
+#include "support/open_descriptors.h"
 #include "support/socket.h"
 
 namespace raid::test {
@@ -44,9 +45,17 @@ private:
     Socket before;
 };
 
-std::size_t entriesOf(const char* directory) {
-    const std::filesystem::directory_iterator entries(directory);
-    return static_cast<std::size_t>(std::distance(begin(entries), end(entries)));
+std::size_t threadsNow() {
+    const std::filesystem::directory_iterator tasks("/proc/self/task");
+    return static_cast<std::size_t>(std::distance(begin(tasks), end(tasks)));
+}
+
+std::vector<int> sequenceNumbers() {
+    std::vector<int> numbers;
+    for (int position = 0; position < getRAIDEventCount(); ++position) {
+        numbers.push_back(getRAIDEventSequenceNumber(position));
+    }
+    return numbers;
 }
 
 void setLevel(int level) {
@@ -78,9 +87,7 @@ const std::map<HostCall, Call> calls{
 
 }  // namespace
 
-Footprint Footprint::ofThisProcess() {
-    return {entriesOf("/proc/self/task"), entriesOf("/proc/self/fd")};
-}
+Footprint Footprint::ofThisProcess() { return {threadsNow(), openDescriptors().size()}; }
 
 Host::Host(Simulator& served) : simulator(served) {
     simulator.serveMarked();
@@ -106,7 +113,7 @@ void Host::markEvents() {
     const QuietOutput quiet;
     setRAIDEventSequenceNumber(2);
     getEvent();
-    eventsBefore = getRAIDEventCount();
+    eventsBefore = sequenceNumbers();
 }
 
 void Host::startGood(const FaultOutcome& outcome) {
@@ -144,10 +151,11 @@ Fate Host::configuration() const {
 }
 
 Fate Host::events() const {
+    const auto events = sequenceNumbers();
     if (raidEvents == nullptr) {
-        return Fate::lost;
+        return events.empty() ? Fate::lost : Fate::unsaid;
     }
-    return getRAIDEventCount() == eventsBefore ? Fate::kept : Fate::replaced;
+    return events == eventsBefore ? Fate::kept : Fate::replaced;
 }
 
 std::string Host::log() {

@@ -49,7 +49,7 @@ private:
     std::string marked;  // the same with another speed of a channel
     std::unique_ptr<RAIDSystem> markedSystem;
     std::vector<RAIDChannel> markedChannels;
-    int eventsBefore = 0;
+    std::vector<int> eventsBefore;
 };
 
 }  // namespace raid::test

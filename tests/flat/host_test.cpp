@@ -37,6 +37,11 @@ protected:
         return exported<Function>(name, library);
     }
 
+    template <class Type>
+    [[nodiscard]] Type variable(const char* name) const {
+        return *static_cast<const Type*>(dlsym(library, name));
+    }
+
     [[nodiscard]] std::size_t sizeOf(const char* name) const {
         Dl_info info{};
         const ElfW(Sym)* symbol = nullptr;
@@ -85,6 +90,18 @@ TEST_F(Host, FindsTheGlobalsWithTheirSizes) {
              Global{"RAIDEventList", list},
          }) {
         EXPECT_EQ(sizeOf(name), size) << name;
+    }
+}
+
+TEST_F(Host, FindsTheGlobalsAtRest) {
+    for (const char* const flag : {"endFlag", "cancelEvent", "refresh", "initialized"}) {
+        EXPECT_EQ(variable<unsigned char>(flag), 0) << flag;
+    }
+    for (const char* const number : {"configRead", "LOG_LEVEL", "nextSequenceNumber"}) {
+        EXPECT_EQ(variable<int>(number), 0) << number;
+    }
+    for (const char* const pointer : {"raidSystem", "raidEvents"}) {
+        EXPECT_EQ(variable<const void*>(pointer), nullptr) << pointer;
     }
 }
 

@@ -9,9 +9,7 @@
 #include <string>
 #include <vector>
 
-#include "support/answering_service.h"
-#include "support/documents.h"
-#include "support/elements.h"
+#include "full_answers.h"
 #include "support/files.h"
 #include "support/row.h"
 
@@ -39,12 +37,6 @@ Ended run(const std::string& command) {
 }
 
 std::string quoted(const std::string& word) { return "'" + word + "'"; }
-
-Answers fullAnswers() {
-    return {.configuration = readFile(RAID_EXAMPLES "/mixed.xml"),
-            .events = eventsDocument(element("ac:events", "<ac:event/><ac:event/>")),
-            .newestEvent = "7"};
-}
 
 struct Manner : Row {
     using Row::Row;

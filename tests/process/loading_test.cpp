@@ -10,9 +10,7 @@
 #include <string>
 
 #include "../flat/exported.h"
-#include "support/answering_service.h"
-#include "support/documents.h"
-#include "support/elements.h"
+#include "full_answers.h"
 #include "support/files.h"
 
 namespace {
@@ -54,12 +52,6 @@ void fillTheLists(const Library& library) {
          {"getPellionAdapterCount", "getRAIDDiskDriveCount", "getRAIDEventCount"}) {
         ASSERT_GT(call(count), 0) << count;
     }
-}
-
-Answers fullAnswers() {
-    return {.configuration = readFile(RAID_EXAMPLES "/mixed.xml"),
-            .events = eventsDocument(element("ac:events", "<ac:event/><ac:event/>")),
-            .newestEvent = "7"};
 }
 
 TEST(Loading, AgainAndAgainCostsNoMemory) {

@@ -7,6 +7,7 @@
 #include "RAIDInstrumentation.h"
 #include "agent/envelope.h"
 #include "flat/lists.h"
+#include "support/inventory_lists.h"
 
 namespace raid::test {
 
@@ -20,10 +21,8 @@ protected:
         // An empty answer leaves no configuration and no events.
         processXML(emptyAnswer(), 0);
         processEventXML(emptyAnswer(), 0);
-        clear(PellionAdapterList, LSIAdapterList, VantryAdapterList, ChannelList, RAIDArrayList,
-              SpannedRAIDArrayList, RAIDLogicalDriveList, RAIDDiskDriveList,
-              RAIDEnclosureDeviceList, RAIDFanList, RAIDPowerSupplyList, RAIDTempSensorList,
-              RAIDEventList);
+        forEachInventoryList([](auto& list) { list.clear(); });
+        RAIDEventList.clear();
         endFlag = 0;
         cancelEvent = 0;
         refresh = 0;
@@ -33,11 +32,6 @@ protected:
 
 private:
     static char* emptyAnswer() { return static_cast<char*>(std::calloc(1, 1)); }
-
-    template <class... Lists>
-    static void clear(Lists&... lists) {
-        (lists.clear(), ...);
-    }
 };
 
 }  // namespace raid::test

@@ -13,7 +13,17 @@ std::atomic<int> expectedGrowth{0};
 
 using Descriptors = std::map<int, std::string>;
 
-Descriptors openDescriptors() {
+std::string describe(const Descriptors& descriptors) {
+    std::string text;
+    for (const auto& [number, target] : descriptors) {
+        text += "\n  " + std::to_string(number) + " -> " + target;
+    }
+    return text;
+}
+
+}  // namespace
+
+std::map<int, std::string> openDescriptors() {
     Descriptors open;
     // Looked up after the iteration, which has a descriptor of its own.
     std::vector<std::string> names;
@@ -29,16 +39,6 @@ Descriptors openDescriptors() {
     }
     return open;
 }
-
-std::string describe(const Descriptors& descriptors) {
-    std::string text;
-    for (const auto& [number, target] : descriptors) {
-        text += "\n  " + std::to_string(number) + " -> " + target;
-    }
-    return text;
-}
-
-}  // namespace
 
 void expectOpenDescriptors(int count) { expectedGrowth = count; }
 

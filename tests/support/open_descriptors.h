@@ -7,6 +7,9 @@
 
 namespace raid::test {
 
+// The descriptors of this process, and what they are open for.
+[[nodiscard]] std::map<int, std::string> openDescriptors();
+
 // Says that the running test leaves this many descriptors open, by design.
 void expectOpenDescriptors(int count);
 

@@ -12,66 +12,20 @@
 #include <algorithm>
 #include <array>
 #include <bit>
-#include <cctype>
 #include <cerrno>
-#include <charconv>
 #include <chrono>
 #include <cstdint>
 #include <fstream>
 #include <list>
 #include <stdexcept>
 
+#include "support/whole_request.h"
+
 namespace raid::test {
 
 namespace {
 
 constexpr std::chrono::seconds patience{60};
-
-Socket makeWakeUp() {
-    const int descriptor = eventfd(0, EFD_CLOEXEC);
-    throwIfNegative(descriptor, "create an event descriptor");
-    return Socket(descriptor);
-}
-
-std::string lowered(std::string_view text) {
-    std::string result(text);
-    std::ranges::transform(result, result.begin(), [](unsigned char character) {
-        return static_cast<char>(std::tolower(character));
-    });
-    return result;
-}
-
-// Where the header ends (CR LF or bare LF), or npos.
-std::size_t bodyStart(std::string_view request) {
-    std::size_t start = std::string_view::npos;
-    for (const std::string_view blankLine : {"\n\n", "\r\n\r\n"}) {
-        if (const auto found = request.find(blankLine); found != std::string_view::npos) {
-            start = std::min(start, found + blankLine.size());
-        }
-    }
-    return start;
-}
-
-std::size_t contentLength(std::string_view header) {
-    constexpr std::string_view name = "content-length:";
-    const std::string text = lowered(header);
-    const auto found = text.find(name);
-    if (found == std::string::npos) {
-        return 0;
-    }
-    const auto digits = text.find_first_not_of(' ', found + name.size());
-    std::size_t length = 0;
-    if (digits != std::string::npos) {
-        std::from_chars(text.data() + digits, text.data() + text.size(), length);
-    }
-    return length;
-}
-
-bool isWhole(std::string_view request) {
-    const std::size_t start = bodyStart(request);
-    return start != std::string_view::npos &&
-           request.size() >= start + contentLength(request.substr(0, start));
-}
 
 in_port_t port(const Socket& socket, decltype(getpeername)* name) {
     sockaddr_in address{};
@@ -136,7 +90,7 @@ Connection answering(std::string_view body) { return {.pieces = {answer(body)}};
 ScriptedService::ScriptedService(std::vector<Connection> connections)
     : script(std::move(connections)),
       listener(Socket::listening()),
-      wakeUp(makeWakeUp()),
+      wakeUp(Socket::event()),
       records(script.size()),
       acceptor([this](const std::stop_token& stop) { acceptConnections(stop); }) {}
 
@@ -206,7 +160,7 @@ void ScriptedService::serve(std::size_t index, Socket client, const std::stop_to
 void ScriptedService::readRequest(std::size_t index, const Socket& client) {
     std::string request;
     std::array<char, 4096> buffer{};
-    while (!isWhole(request) && waitReadable(client)) {
+    while (!isWholeRequest(request) && waitReadable(client)) {
         const ssize_t received = recv(client.get(), buffer.data(), buffer.size(), 0);
         if (received <= 0) {
             break;

@@ -1,6 +1,7 @@
 #include "support/socket.h"
 
 #include <netinet/in.h>
+#include <sys/eventfd.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
@@ -46,6 +47,12 @@ Socket& Socket::operator=(Socket&& other) noexcept {
 Socket Socket::tcp() {
     const int created = ::socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0);
     throwIfNegative(created, "create a socket");
+    return Socket(created);
+}
+
+Socket Socket::event() {
+    const int created = eventfd(0, EFD_CLOEXEC);
+    throwIfNegative(created, "create an event descriptor");
     return Socket(created);
 }
 

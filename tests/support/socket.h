@@ -23,6 +23,8 @@ public:
     [[nodiscard]] static Socket listening();
     // Connected to the service's port and address.
     [[nodiscard]] static Socket connected();
+    // Readable once it was written to: what wakes a thread that waits for descriptors.
+    [[nodiscard]] static Socket event();
 
     [[nodiscard]] int get() const noexcept { return descriptor; }
     void close() noexcept;

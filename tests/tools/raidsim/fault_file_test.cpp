@@ -89,9 +89,18 @@ TEST(FaultFiles, StandForACaseForEveryCombinationOfTheirValues) {
     EXPECT_EQ(errorOf([&] { (void)file.at(6); }), "there are 6 cases, counted from 0");
 }
 
-TEST(FaultFiles, LeaveBracesAloneThatNameNothing) {
-    EXPECT_THAT(answered("vary cut 1..2\nbody text \"{length} {} {other}\""),
-                testing::EndsWith("\n\n{length} {} {other}"));
+TEST(FaultFiles, LeaveBracesAloneThatHoldNoName) {
+    EXPECT_THAT(answered("body text \"{length} {} {Other} {a b} {open\""),
+                testing::EndsWith("\n\n{length} {} {Other} {a b} {open"));
+}
+
+TEST(FaultFiles, AreRefusedForANameThatStandsForNothing) {
+    EXPECT_EQ(mistakeIn("vary cut 1..2\nsend {cutt}"), "line 3: nothing is called {cutt}");
+    EXPECT_EQ(mistakeIn("vary cut 1..2\nsend 1"), "nothing uses {cut}");
+}
+
+TEST(FaultFiles, AreRefusedForWhatComesBehindTheEnd) {
+    EXPECT_EQ(mistakeIn("end close\nsend 1"), "line 3: the connection has ended");
 }
 
 TEST(FaultSteps, AreByDefaultThoseOfAGoodService) {

@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <charconv>
 #include <filesystem>
+#include <set>
 
 #include "fault/instructions.h"
 #include "files.h"
@@ -14,7 +15,7 @@ namespace {
 
 constexpr std::size_t mostCases = 1'000'000;
 
-// What stands between braces is left to the caller: {length} is known when the answer is.
+// {length} is no variable: it becomes a number when the answer is made.
 constexpr std::string_view lengthName = "length";
 
 char escapedByte(std::string_view line, std::size_t& at) {
@@ -45,6 +46,20 @@ char escapedByte(std::string_view line, std::size_t& at) {
 
 bool isName(std::string_view word) {
     return !word.empty() && std::ranges::all_of(word, [](char c) { return c >= 'a' && c <= 'z'; });
+}
+
+// The names between braces.
+std::vector<std::string> namesIn(const std::vector<std::string>& words) {
+    std::vector<std::string> names;
+    for (const std::string_view word : words) {
+        for (auto open = word.find('{'); open != std::string_view::npos;
+             open = word.find('{', open + 1)) {
+            const auto name = word.substr(open + 1, word.find('}', open) - open - 1);
+            if (open + 1 + name.size() < word.size() && isName(name))
+                names.emplace_back(name);
+        }
+    }
+    return names;
 }
 
 template <typename Action>
@@ -82,11 +97,12 @@ std::vector<std::string> faultWords(std::string_view line) {
 }
 
 std::size_t FaultFile::Variable::size() const {
-    return values.empty() ? static_cast<std::size_t>(last - first + 1) : values.size();
+    return values.empty() ? static_cast<std::size_t>(last - first) + 1 : values.size();
 }
 
 std::string FaultFile::Variable::at(std::size_t index) const {
-    return values.empty() ? std::to_string(first + static_cast<long>(index)) : values[index];
+    return values.empty() ? std::to_string(first + static_cast<std::int64_t>(index))
+                          : values[index];
 }
 
 // `vary NAME FIRST..LAST` or `vary NAME VALUE VALUE...`
@@ -121,6 +137,7 @@ FaultFile::FaultFile(const std::string& path)
     }
     if (sentence.empty())
         throw FaultError("the file has no title");
+    checkNames();
     (void)at(0);
     (void)at(count - 1);
 }
@@ -132,12 +149,32 @@ void FaultFile::take(Line line) {
         sentence = line.words[1];
     } else if (line.words[0] == "vary") {
         variables.push_back(variableOf(line.words));
-        count *= variables.back().size();
-        if (count > mostCases)
+        const std::size_t values = variables.back().size();
+        if (values > mostCases / count)
             throw FaultError("the file stands for too many cases");
+        count *= values;
     } else {
         lines.push_back(std::move(line));
     }
+}
+
+// Every {name} must be a variable, and every variable be used.
+void FaultFile::checkNames() const {
+    std::set<std::string> unused;
+    for (const Variable& variable : variables)
+        unused.insert(variable.name);
+    const std::set<std::string> known = unused;
+    for (const Line& line : lines) {
+        inLine(line.number, [&] {
+            for (const auto& name : namesIn(line.words)) {
+                if (name != lengthName && !known.contains(name))
+                    throw FaultError("nothing is called {" + name + "}");
+                unused.erase(name);
+            }
+        });
+    }
+    if (!unused.empty())
+        throw FaultError("nothing uses {" + *unused.begin() + "}");
 }
 
 FaultCase FaultFile::at(std::size_t number) const {

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -33,14 +34,15 @@ private:
     struct Variable {
         std::string name;
         std::vector<std::string> values;  // or else a range of numbers
-        long first = 0;
-        long last = -1;
+        std::int64_t first = 0;
+        std::int64_t last = -1;
 
         [[nodiscard]] std::size_t size() const;
         [[nodiscard]] std::string at(std::size_t index) const;
     };
 
     void take(Line line);
+    void checkNames() const;
     static Variable variableOf(const std::vector<std::string>& words);
 
     std::string folder;
@@ -51,9 +53,8 @@ private:
     std::size_t count = 1;
 };
 
-// Cuts a line of a fault file into words. Inside double quotes blanks are kept, and "\n", "\r",
-// "\t",
-// "\0", "\xNN", "\\" and "\"" stand for one byte. Throws FaultError.
+// Cuts a line of a fault file into words. Inside double quotes blanks are kept, and the escapes
+// that docs/faults.md lists stand for one byte. Throws FaultError.
 [[nodiscard]] std::vector<std::string> faultWords(std::string_view line);
 
 }  // namespace raidsim

@@ -86,7 +86,8 @@ Change appendText(const CaseBuilder&, const Words& words) {
     if (!times.starts_with('x'))
         refuse(times, "a count such as x100");
     return [piece = words[0], count = sizeOf(times.substr(1))](std::string& text) {
-        if (text.size() + piece.size() * count > bounds::fileBytes)
+        if (count > 0 &&
+            piece.size() > (bounds::fileBytes - std::min(bounds::fileBytes, text.size())) / count)
             throw FaultError("the answer becomes too long");
         for (std::size_t done = 0; done < count; ++done)
             text.append(piece);
@@ -196,7 +197,11 @@ Result formOf(const std::array<Form<Result>, count>& forms, const CaseBuilder& b
 
 // The instructions, each with the number of its words.
 
-void addStep(CaseBuilder& builder, FaultStep step) { builder.built.steps.push_back(step); }
+void addStep(CaseBuilder& builder, FaultStep step) {
+    if (builder.ends)
+        throw FaultError("the connection has ended");
+    builder.built.steps.push_back(step);
+}
 
 void meets(CaseBuilder& builder, const Words& words) {
     builder.built.meets = chosenFrom(requests, words[1]);
@@ -239,8 +244,8 @@ void pause(CaseBuilder& builder, const Words& words) {
 }
 
 void end(CaseBuilder& builder, const Words& words) {
-    builder.ends = true;
     addStep(builder, {chosenFrom(endings, words[1])});
+    builder.ends = true;
 }
 
 void refuseConnections(CaseBuilder& builder, const Words&) { builder.built.refuses = true; }

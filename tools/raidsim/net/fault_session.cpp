@@ -118,29 +118,39 @@ void FaultSession::readRequest() {
 }
 
 void FaultSession::readUpTo(std::size_t bytes) {
-    boost::asio::async_read(socket, boost::asio::buffer(chunk, std::min(bytes, chunk.size())),
-                            [self = shared_from_this()](error_code, std::size_t) { self->next(); });
+    boost::asio::async_read(
+        socket, boost::asio::buffer(chunk, std::min(bytes, chunk.size())),
+        [self = shared_from_this(), bytes](error_code error, std::size_t count) {
+            if (error || count == bytes) {
+                self->next();
+            } else {
+                self->readUpTo(bytes - count);
+            }
+        });
 }
 
 void FaultSession::sendUpTo(std::size_t end) {
-    end = std::min(end, answer.bytes.size());
-    if (sent >= end) {
+    sendEnd = std::min(end, answer.bytes.size());
+    sendOn();
+}
+
+void FaultSession::sendOn() {
+    if (sent >= sendEnd) {
         next();
         return;
     }
-    const std::size_t size = pieceBytes == 0 ? end - sent : std::min(pieceBytes, end - sent);
+    const std::size_t left = sendEnd - sent;
+    const std::size_t size = pieceBytes == 0 ? left : std::min(pieceBytes, left);
     boost::asio::async_write(socket, boost::asio::buffer(answer.bytes.data() + sent, size),
-                             [self = shared_from_this(), end](error_code error, std::size_t count) {
+                             [self = shared_from_this()](error_code error, std::size_t count) {
                                  self->sent += count;
                                  if (error) {
                                      self->close();
-                                 } else if (self->sent == end) {
+                                 } else if (self->sent == self->sendEnd) {
                                      self->next();
                                  } else {
-                                     // The piece must be taken before the next one leaves: this
-                                     // step once more, with what is left of it.
-                                     self->play.chosen.steps[--self->step].bytes = end - self->sent;
-                                     self->whenTaken(&FaultSession::next);
+                                     // The piece must be taken before the next one leaves.
+                                     self->whenTaken(&FaultSession::sendOn);
                                  }
                              });
 }

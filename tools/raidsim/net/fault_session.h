@@ -29,6 +29,7 @@ private:
     void readRequest();
     void readUpTo(std::size_t bytes);
     void sendUpTo(std::size_t end);
+    void sendOn();
     void whenTaken(void (FaultSession::*then)());
     void shutDown();
     void drain();
@@ -46,6 +47,7 @@ private:
     bool open = true;
     std::size_t step = 0;
     std::size_t sent = 0;
+    std::size_t sendEnd = 0;
     std::size_t pieceBytes = 0;  // 0: whatever a write takes
     std::string request;
     std::array<char, 4096> chunk{};

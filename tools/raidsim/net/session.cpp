@@ -90,7 +90,7 @@ void Session::ended() {
     }
 }
 
-bool Session::meetsFault(const http::Request& whole) {
+bool Session::handToFault(const http::Request& whole) {
     const auto kind = Service::kindOf(whole);
     auto play = kind ? service.faults().meetRequest(*kind) : std::nullopt;
     if (!play)
@@ -102,7 +102,7 @@ bool Session::meetsFault(const http::Request& whole) {
 }
 
 void Session::handle(const http::Request& whole) {
-    if (meetsFault(whole))
+    if (handToFault(whole))
         return;
     Service::Reply reply = service.reply(whole);
     if (const auto* const ready = std::get_if<http::Answer>(&reply)) {

@@ -41,7 +41,7 @@ private:
     void received(std::size_t count);
     void ended();
     void handle(const http::Request& request);
-    bool meetsFault(const http::Request& request);
+    bool handToFault(const http::Request& request);
     void answer(const http::Answer& answer);
     void answered();
     void limit(std::chrono::milliseconds time);

@@ -1,0 +1,288 @@
+"""Changes the reader and the snapshot in small ways, and counts the changes that no test notices.
+
+  scripts/mutate                  every change, in the 64-bit build
+  scripts/mutate --width i386     in the 32-bit build
+  scripts/mutate --sample N       N of the changes, spread evenly: what scripts/test runs
+  scripts/mutate --list           shows the changes and makes none
+
+The changes are made in copies of the tree below build/mutation.
+"""
+
+import argparse
+import collections
+import concurrent.futures
+import dataclasses
+import os
+import pathlib
+import queue
+import re
+import shutil
+import subprocess
+import sys
+
+from explained import explained
+
+ROOT = pathlib.Path(__file__).resolve().parent.parent
+WORK = ROOT / "build" / "mutation"
+SURVIVORS = ROOT / "tests" / "mutation" / "survivors.txt"
+
+MUTATED = [
+    "src/agent/envelope.cpp",
+    "src/agent/first_chunk.cpp",
+    "src/base/decimal.cpp",
+    "src/events/raid_events_vocabulary.h",
+    "src/flat/snapshot.cpp",
+    "src/model/arrays_vocabulary.h",
+    "src/model/channels_and_drives_vocabulary.h",
+    "src/model/enclosures_vocabulary.h",
+    "src/model/logical_drives_vocabulary.h",
+    "src/model/numbering.cpp",
+    "src/model/system_and_adapter_vocabulary.h",
+    "src/xml/element_reader.h",
+    "src/xml/parse_def_unit.cpp",
+    "src/xml/raid_xml_error.cpp",
+    "src/xml/reading_errors.cpp",
+    "src/xml/scan.h",
+    "src/xml/space.h",
+    "src/xml/unit.h",
+    "src/xml/vocabulary.h",
+]
+
+# Those that notice most come first. The own ones have the library's objects or its path compiled in,
+# and so each copy of the tree builds them; the others find the library of any copy.
+TESTS = [
+    "xml_test",
+    "model_test",
+    "agent_link_test",
+    "flat_test",
+    "numbering_test",
+    "events_test",
+    "base_test",
+    "exchange_test",
+    "host_test",
+    "loading_test",
+]
+OWN_TESTS = ["numbering_test", "base_test", "host_test", "loading_test"]
+
+# A comparison has spaces around it, which tells it from the brackets of a template.
+REPLACEMENTS = [
+    (r" == ", [" != "]),
+    (r" != ", [" == "]),
+    (r" < ", [" <= "]),
+    (r" > ", [" >= "]),
+    (r" <= ", [" < "]),
+    (r" >= ", [" > "]),
+    (r" && ", [" || "]),
+    (r" \|\| ", [" && "]),
+    (r" \+ ", [" - "]),
+    (r" - ", [" + "]),
+    (r" \+= ", [" -= "]),
+    (r" -= ", [" += "]),
+    (r"\+\+(?=[a-z])", ["--"]),
+    (r"--(?=[a-z])", ["++"]),
+    (r"(?<=[a-z])\+\+", ["--"]),
+    (r"(?<=[( !])!(?=[a-z*(])", [""]),
+    # What has no comparison or "!" that can be changed instead.
+    (r"\b(if|while) \((?!.* [=!<>]=? )(?!!)(?!.* = )(?=.*\) \{$)", [r"\1 (!"]),
+    (r"\btrue\b", ["false"]),
+    (r"\bfalse\b", ["true"]),
+    (r"(?<![\w\"'.:])\d+(?![\w'.])", ["NEXT"]),
+    (r"\breturn (?!0;|false;|nullptr;|std::nullopt;|\{)(.+);", ["return {};"]),
+]
+STRING = re.compile(r'"(?:[^"\\]|\\.)*"')
+# A call or an assignment that stands alone.
+STATEMENT = re.compile(r"^\s+(?!return|const |auto |constexpr |using |static |friend |throw |\}|break)"
+                       r"[\w.*>:\-\[\]]+[^{}]*;(?:  //.*)?$")
+
+
+@dataclasses.dataclass(frozen=True)
+class Mutant:
+    path: str
+    line: int  # from 0
+    changed: str
+    original: str
+
+    @property
+    def key(self):
+        return f"{self.path}: {self.original.strip()} => {self.changed.strip() or '(nothing)'}"
+
+
+def code_of(line):
+    """The line without its comment."""
+    return re.sub(r"\s*//.*$", "", line)
+
+
+def mutants_of_line(path, number, line):
+    code = code_of(line)
+    if not code.strip() or code.lstrip().startswith(("#", "static_assert", "[[noreturn]]")):
+        return
+    if code.endswith(("= delete;", "= default;")):
+        return
+    seen = {line}
+
+    def mutant(changed):
+        if changed not in seen:
+            seen.add(changed)
+            yield Mutant(path, number, changed, line)
+
+    strings = [match.span() for match in STRING.finditer(code)]
+    for start, end in strings:
+        yield from mutant(line[: end - 1] + "~" + line[end - 1 :])
+    for pattern, replacements in REPLACEMENTS:
+        for match in re.finditer(pattern, code):
+            if any(start <= match.start() < end for start, end in strings):
+                continue
+            for replacement in replacements:
+                new = (str(int(match.group()) + 1) if replacement == "NEXT"
+                       else match.expand(replacement))
+                closing = ")" if new.endswith(" (!") else ""
+                rest = line[match.end() :]
+                if closing:
+                    new += "("
+                    rest = re.sub(r"\) \{$", ")) {", rest)
+                yield from mutant(line[: match.start()] + new + rest)
+    if STATEMENT.match(code) and code.count("(") == code.count(")"):
+        yield from mutant("")
+
+
+def all_mutants():
+    for path in MUTATED:
+        for number, line in enumerate((ROOT / path).read_text().splitlines()):
+            yield from mutants_of_line(path, number, line)
+
+
+def files_of_the_tree():
+    for folder, folders, names in os.walk(ROOT):
+        if pathlib.Path(folder) == ROOT:
+            folders[:] = [name for name in folders if name not in ("build", ".git")]
+        yield from (pathlib.Path(folder, name) for name in names)
+
+
+class Copy:
+    """A copy of the tree with a build of the library; the first has the tests for all of them."""
+
+    def __init__(self, number, width):
+        self.root = WORK / f"{width}-{number}"
+        self.build = self.root / "build"
+        for source in files_of_the_tree():
+            target = self.root / source.relative_to(ROOT)
+            if target.exists() and target.read_bytes() == source.read_bytes():
+                continue  # so that it is not compiled again
+            target.parent.mkdir(parents=True, exist_ok=True)
+            shutil.copy(source, target)
+        flags = "-O0 -m32" if width == "i386" else "-O0"
+        self.run("cmake", "-S", self.root, "-B", self.build, "-G", "Ninja",
+                 "-DCMAKE_BUILD_TYPE=None", f"-DCMAKE_CXX_FLAGS={flags}",
+                 f"-DCMAKE_C_FLAGS={flags}", "-DRAID_BUILD_TESTS=ON", "-DRAID_LIBRARY_ONLY=ON")
+        self.tests = WORK / f"{width}-0" / "build" / "tests" / "bin"
+        targets = TESTS if number == 0 else OWN_TESTS
+        self.run("cmake", "--build", self.build, "--target", "RAIDInstrumentation", *targets)
+
+    @staticmethod
+    def run(*command):
+        finished = subprocess.run([str(word) for word in command], stdin=subprocess.DEVNULL,
+                                  stdout=subprocess.PIPE, stderr=subprocess.STDOUT, check=False)
+        if finished.returncode != 0:
+            sys.exit(finished.stdout.decode(errors="replace") + "\nThe copy does not build.")
+
+    def builds(self):
+        return subprocess.run(
+            ["cmake", "--build", str(self.build), "--parallel", "1", "--target",
+             "RAIDInstrumentation", *OWN_TESTS],
+            stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
+            check=False).returncode == 0
+
+    def passes(self, test):
+        folder = self.build / "tests" / "bin" if test in OWN_TESTS else self.tests
+        try:
+            return subprocess.run(
+                [str(folder / test), "--gtest_brief=1", "--gtest_fail_fast"],
+                env=os.environ | {"LD_LIBRARY_PATH": str(self.build)},
+                stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
+                timeout=60, check=False).returncode == 0
+        except subprocess.TimeoutExpired:
+            return False
+
+    def try_out(self, mutant):
+        """How the change ends: "invalid", the test that noticed it, or None."""
+        path = self.root / mutant.path
+        original = path.read_text()
+        lines = original.splitlines()
+        lines[mutant.line] = mutant.changed
+        try:
+            path.write_text("\n".join(lines) + "\n")
+            if not self.builds():
+                return "invalid"
+            return next((test for test in TESTS if not self.passes(test)), None)
+        finally:
+            path.write_text(original)
+
+
+def main():
+    parser = argparse.ArgumentParser(description=__doc__,
+                                     formatter_class=argparse.RawDescriptionHelpFormatter)
+    parser.add_argument("--width", choices=["amd64", "i386"], default="amd64")
+    parser.add_argument("--sample", type=int, metavar="N")
+    parser.add_argument("--list", action="store_true")
+    options = parser.parse_args()
+
+    mutants = list(all_mutants())
+    if options.list:
+        print("\n".join(mutant.key for mutant in mutants))
+        return
+    if options.sample:
+        step = max(len(mutants) // options.sample, 1)
+        mutants = mutants[step // 2 :: step]
+
+    known = collections.Counter(explained(SURVIVORS))
+    copies = queue.SimpleQueue()
+    workers = len(os.sched_getaffinity(0))
+    WORK.mkdir(parents=True, exist_ok=True)
+    with concurrent.futures.ThreadPoolExecutor(workers) as pool:
+        for copy in [Copy(number, options.width) for number in range(workers)]:
+            for test in TESTS:
+                if not copy.passes(test):
+                    sys.exit(f"{test} fails without a change.")
+            copies.put(copy)
+
+        def outcome(mutant):
+            copy = copies.get()
+            try:
+                return mutant, copy.try_out(mutant)
+            finally:
+                copies.put(copy)
+
+        counts = {"invalid": 0, "noticed": 0, "explained": 0, "survived": 0}
+        log = WORK / f"{options.width}.log"
+        with log.open("w") as lines:
+            for mutant, end in pool.map(outcome, mutants):
+                if end == "invalid":
+                    kind = "invalid"
+                elif end is not None:
+                    kind = "noticed"
+                else:
+                    kind = "explained" if known[mutant.key] > 0 else "survived"
+                    known[mutant.key] -= 1
+                counts[kind] += 1
+                print(f"{kind} {end or '-'} {mutant.line + 1} {mutant.key}", file=lines, flush=True)
+                if kind == "survived":
+                    print(f"survived: {mutant.key} (line {mutant.line + 1})", flush=True)
+
+    valid = len(mutants) - counts["invalid"]
+    if valid < len(mutants) / 2:
+        sys.exit(f"Of {len(mutants)} changes only {valid} compiled: that is not for the changes.")
+    surviving = counts["explained"] + counts["survived"]
+    print(f"{options.width}: {valid} changes, {counts['noticed']} noticed, {surviving} survived "
+          f"({100 * surviving / valid:.1f} %), {counts['survived']} of them unexplained; "
+          f"{counts['invalid']} more did not compile")
+    stale = [] if options.sample else [key for key, count in known.items() if count > 0]
+    for key in stale:
+        print(f"explained, but noticed or gone: {key}")
+    if stale:
+        sys.exit("tests/mutation/survivors.txt explains what does not survive.")
+    if counts["survived"]:
+        sys.exit("A change survived that tests/mutation/survivors.txt does not explain.")
+
+
+if __name__ == "__main__":
+    main()
