@@ -3,6 +3,7 @@
   scripts/mutate                  every change, in the 64-bit build
   scripts/mutate --width i386     in the 32-bit build
   scripts/mutate --sample N       N of the changes, spread evenly: what scripts/test runs
+  scripts/mutate FILE...          the changes of these files only
   scripts/mutate --list           shows the changes and makes none
 
 The changes are made in copies of the tree below build/mutation.
@@ -224,9 +225,14 @@ def main():
     parser.add_argument("--width", choices=["amd64", "i386"], default="amd64")
     parser.add_argument("--sample", type=int, metavar="N")
     parser.add_argument("--list", action="store_true")
+    parser.add_argument("files", nargs="*", metavar="FILE")
     options = parser.parse_args()
 
-    mutants = list(all_mutants())
+    unknown = sorted(set(options.files) - set(MUTATED))
+    if unknown:
+        parser.error(f"{unknown[0]} is not among the files that are changed: {' '.join(MUTATED)}")
+    mutants = [mutant for mutant in all_mutants()
+               if not options.files or mutant.path in options.files]
     if options.list:
         print("\n".join(mutant.key for mutant in mutants))
         return
@@ -275,7 +281,7 @@ def main():
     print(f"{options.width}: {valid} changes, {counts['noticed']} noticed, {surviving} survived "
           f"({100 * surviving / valid:.1f} %), {counts['survived']} of them unexplained; "
           f"{counts['invalid']} more did not compile")
-    stale = [] if options.sample else [key for key, count in known.items() if count > 0]
+    stale = [] if options.sample or options.files else [key for key, count in known.items() if count > 0]
     for key in stale:
         print(f"explained, but noticed or gone: {key}")
     if stale:
