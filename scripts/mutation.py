@@ -18,6 +18,7 @@ import pathlib
 import queue
 import re
 import shutil
+import signal
 import subprocess
 import sys
 
@@ -50,7 +51,7 @@ MUTATED = [
 ]
 
 # Those that notice most come first. The own ones have the library's objects or its path compiled in,
-# and so each copy of the tree builds them; the others find the library of any copy.
+# and so each copy of the tree builds them; the others are those of the preset, and find any library.
 TESTS = [
     "xml_test",
     "model_test",
@@ -160,7 +161,7 @@ def files_of_the_tree():
 
 
 class Copy:
-    """A copy of the tree with a build of the library; the first has the tests for all of them."""
+    """A copy of the tree with a build of the library."""
 
     def __init__(self, number, width):
         self.root = WORK / f"{width}-{number}"
@@ -175,9 +176,9 @@ class Copy:
         self.run("cmake", "-S", self.root, "-B", self.build, "-G", "Ninja",
                  "-DCMAKE_BUILD_TYPE=None", f"-DCMAKE_CXX_FLAGS={flags}",
                  f"-DCMAKE_C_FLAGS={flags}", "-DRAID_BUILD_TESTS=ON", "-DRAID_LIBRARY_ONLY=ON")
-        self.tests = WORK / f"{width}-0" / "build" / "tests" / "bin"
-        targets = TESTS if number == 0 else OWN_TESTS
-        self.run("cmake", "--build", self.build, "--target", "RAIDInstrumentation", *targets)
+        self.tests = ROOT / "build" / width / "tests" / "bin"
+        self.run("cmake", "--build", self.build, "--parallel", "1", "--target",
+                 "RAIDInstrumentation", *OWN_TESTS)
 
     @staticmethod
     def run(*command):
@@ -220,7 +221,8 @@ class Copy:
 
 
 def main():
-    parser = argparse.ArgumentParser(description=__doc__,
+    signal.signal(signal.SIGPIPE, signal.SIG_DFL)  # "--list | head" ends quietly
+    parser = argparse.ArgumentParser(prog="scripts/mutate", description=__doc__,
                                      formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("--width", choices=["amd64", "i386"], default="amd64")
     parser.add_argument("--sample", type=int, metavar="N")
@@ -245,7 +247,9 @@ def main():
     workers = len(os.sched_getaffinity(0))
     WORK.mkdir(parents=True, exist_ok=True)
     with concurrent.futures.ThreadPoolExecutor(workers) as pool:
-        for copy in [Copy(number, options.width) for number in range(workers)]:
+        Copy.run("cmake", "--preset", options.width, "-DRAID_BUILD_TESTS=ON")
+        Copy.run("cmake", "--build", "--preset", options.width, "--target", *TESTS)
+        for copy in pool.map(lambda number: Copy(number, options.width), range(workers)):
             for test in TESTS:
                 if not copy.passes(test):
                     sys.exit(f"{test} fails without a change.")

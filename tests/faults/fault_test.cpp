@@ -120,7 +120,7 @@ protected:
     void meet(std::size_t number, const FaultCase& chosen, int level) {
         const FaultOutcome& outcome = chosen.outcome;
         host.startGood(outcome);
-        const auto before = Footprint::ofThisProcess();
+        const auto descriptors = openDescriptors().size();
         simulator.arm(GetParam().path, number);
         int result = 0;
         {
@@ -132,7 +132,7 @@ protected:
         EXPECT_TRUE(chosen.refuses || said.find(" case ") != std::string::npos)
             << "the service met nobody: " << said;
         EXPECT_EQ(said.find("cannot be played"), std::string::npos) << said;
-        expectSound(before, outcome);
+        expectSound(descriptors, outcome);
     }
 
     [[nodiscard]] static std::string label(std::size_t number, const FaultCase& chosen) {
@@ -166,16 +166,16 @@ private:
     }
 
     // What must hold after every fault.
-    void expectSound(const Footprint& before, const FaultOutcome& outcome) {
-        const auto after = Footprint::ofThisProcess();
-        EXPECT_EQ(after.threads, before.threads);
-        EXPECT_EQ(after.descriptors,
-                  before.descriptors + static_cast<std::size_t>(outcome.leftOpen));
+    void expectSound(std::size_t descriptors, const FaultOutcome& outcome) {
+        EXPECT_TRUE(threads.isReachedAgain());
+        EXPECT_EQ(openDescriptors().size(),
+                  descriptors + static_cast<std::size_t>(outcome.leftOpen));
         leftOpen += outcome.leftOpen;
         EXPECT_TRUE(isFree(mutex_handle));
         EXPECT_TRUE(host.isGoodAgain()) << "the next good answer is not published";
     }
 
+    const ThreadCount threads;
     Simulator simulator;
     Host host{simulator};
 };

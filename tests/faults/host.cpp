@@ -3,10 +3,13 @@
 #include <fcntl.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <cstdio>
+#include <filesystem>
 #include <iterator>
 #include <map>
 #include <string_view>
+#include <thread>
 
 #include "RAIDInstrumentation.h"
 #include "agent/agent_link.h"
@@ -15,7 +18,6 @@
 #include "published_state.h"
 #include "support/blocked_call.h"
 #include "support/files.h"
-#include "support/open_descriptors.h"
 #include "support/socket.h"
 
 namespace raid::test {
@@ -87,7 +89,23 @@ const std::map<HostCall, Call> calls{
 
 }  // namespace
 
-Footprint Footprint::ofThisProcess() { return {threadsNow(), openDescriptors().size()}; }
+ThreadCount::ThreadCount() {
+    // With the first one that is started the thread sanitizer starts one, too.
+    pid_t first = 0;
+    std::jthread([&] { first = gettid(); }).join();
+    while (std::filesystem::exists("/proc/self/task/" + std::to_string(first))) {
+        std::this_thread::yield();
+    }
+    before = threadsNow();
+}
+
+bool ThreadCount::isReachedAgain() const {
+    const auto end = std::chrono::steady_clock::now() + std::chrono::seconds(10);
+    while (threadsNow() != before && std::chrono::steady_clock::now() < end) {
+        std::this_thread::yield();
+    }
+    return threadsNow() == before;
+}
 
 Host::Host(Simulator& served) : simulator(served) {
     simulator.serveMarked();

@@ -12,12 +12,16 @@
 
 namespace raid::test {
 
-// What is counted of the process before and after a fault.
-struct Footprint {
-    std::size_t threads;
-    std::size_t descriptors;
+// The threads of this process when it was made, and whether there are as many again.
+class ThreadCount {
+public:
+    ThreadCount();
 
-    [[nodiscard]] static Footprint ofThisProcess();
+    // Waits a little for it: the kernel lists a thread for a moment after it was joined.
+    [[nodiscard]] bool isReachedAgain() const;
+
+private:
+    std::size_t before = 0;
 };
 
 // The library in this process, with a configuration and a batch of events that were good.

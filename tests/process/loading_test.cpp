@@ -56,7 +56,7 @@ void fillTheLists(const Library& library) {
 
 TEST(Loading, AgainAndAgainCostsNoMemory) {
     constexpr int warmUp = 10;
-    constexpr int rounds = 1000;
+    constexpr int rounds = 300;
     // Less than any one list of one round holds, were it left behind.
     constexpr std::size_t tolerated = std::size_t{32} * rounds;
     const AnsweringService service(fullAnswers());
