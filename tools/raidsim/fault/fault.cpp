@@ -9,9 +9,10 @@ namespace {
 constexpr std::string_view lengthMark = "{length}";
 
 void edit(const FaultCase& chosen, bool header, std::string& text) {
-    for (const FaultEdit& change : chosen.edits)
+    for (const FaultEdit& change : chosen.edits) {
         if (change.ofHeader == header)
             change.change(text);
+    }
 }
 
 }  // namespace

@@ -194,11 +194,14 @@ FaultCase FaultFile::at(std::size_t number) const {
     for (const Line& line : lines) {
         inLine(line.number, [&] {
             auto words = line.words;
-            for (auto& word : words)
-                for (const auto& [name, value] : values)
+            for (auto& word : words) {
+                for (const auto& [name, value] : values) {
                     for (auto found = word.find(name); found != std::string::npos;
-                         found = word.find(name, found + value.size()))
+                         found = word.find(name, found + value.size())) {
                         word.replace(found, name.size(), value);
+                    }
+                }
+            }
             obey(builder, words);
         });
     }

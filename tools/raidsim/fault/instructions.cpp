@@ -117,8 +117,8 @@ template <typename Result>
 struct Form {
     std::string_view name;
     std::string_view arguments;
-    std::size_t least;  // words behind the name
-    std::size_t most;
+    std::size_t least = 0;  // words behind the name
+    std::size_t most = 0;
     Result (*make)(const CaseBuilder& builder, const Words& words);
 };
 
@@ -301,9 +301,10 @@ void obey(CaseBuilder& builder, const Words& words) {
     const auto found = std::ranges::find(instructions, words[0], &Instruction::name);
     if (found == instructions.end())
         throw FaultError("unknown instruction \"" + words[0] + "\"");
-    if (words.size() < found->least || words.size() > found->most)
+    if (words.size() < found->least || words.size() > found->most) {
         throw FaultError("usage: " + std::string(found->name) + " " +
                          std::string(found->arguments));
+    }
     found->obey(builder, words);
 }
 

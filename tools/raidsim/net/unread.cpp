@@ -36,9 +36,11 @@ bool clientHasUnread(boost::asio::ip::tcp::socket& socket) {
     std::string to;
     std::string state;
     std::string queues;  // "sent:received", in hexadecimal
-    for (std::string rest; table >> slot >> from >> to >> state >> queues && getline(table, rest);)
+    for (std::string rest;
+         table >> slot >> from >> to >> state >> queues && getline(table, rest);) {
         if (from.ends_with(local) && to.ends_with(remote))
             return queues.substr(queues.find(':') + 1).find_first_not_of('0') != std::string::npos;
+    }
     return false;
 }
 
