@@ -163,7 +163,7 @@ def files_of_the_tree():
 class Copy:
     """A copy of the tree with a build of the library."""
 
-    def __init__(self, number, width):
+    def __init__(self, number, width, jobs):
         self.root = WORK / f"{width}-{number}"
         self.build = self.root / "build"
         for source in files_of_the_tree():
@@ -177,7 +177,8 @@ class Copy:
                  "-DCMAKE_BUILD_TYPE=None", f"-DCMAKE_CXX_FLAGS={flags}",
                  f"-DCMAKE_C_FLAGS={flags}", "-DRAID_BUILD_TESTS=ON", "-DRAID_LIBRARY_ONLY=ON")
         self.tests = ROOT / "build" / width / "tests" / "bin"
-        self.run("cmake", "--build", self.build, "--parallel", "1", "--target",
+        self.jobs = str(jobs)
+        self.run("cmake", "--build", self.build, "--parallel", self.jobs, "--target",
                  "RAIDInstrumentation", *OWN_TESTS)
 
     @staticmethod
@@ -189,7 +190,7 @@ class Copy:
 
     def builds(self):
         return subprocess.run(
-            ["cmake", "--build", str(self.build), "--parallel", "1", "--target",
+            ["cmake", "--build", str(self.build), "--parallel", self.jobs, "--target",
              "RAIDInstrumentation", *OWN_TESTS],
             stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
             check=False).returncode == 0
@@ -244,12 +245,14 @@ def main():
 
     known = collections.Counter(explained(SURVIVORS))
     copies = queue.SimpleQueue()
-    workers = len(os.sched_getaffinity(0))
+    cores = len(os.sched_getaffinity(0))
+    # A copy costs a minute to build.
+    workers = 1 if options.sample and options.sample < 20 else cores
     WORK.mkdir(parents=True, exist_ok=True)
     with concurrent.futures.ThreadPoolExecutor(workers) as pool:
         Copy.run("cmake", "--preset", options.width, "-DRAID_BUILD_TESTS=ON")
         Copy.run("cmake", "--build", "--preset", options.width, "--target", *TESTS)
-        for copy in pool.map(lambda number: Copy(number, options.width), range(workers)):
+        for copy in pool.map(lambda number: Copy(number, options.width, cores // workers), range(workers)):
             for test in TESTS:
                 if not copy.passes(test):
                     sys.exit(f"{test} fails without a change.")
