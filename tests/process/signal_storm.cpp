@@ -2,9 +2,8 @@
 
 #include <unistd.h>
 
-#include <chrono>
+#include <cerrno>
 #include <csignal>
-#include <thread>
 
 #include "support/socket.h"
 
@@ -12,8 +11,16 @@ namespace raid::test {
 
 SignalStorm::SignalStorm() {
     handled = 0;
+    // Never destroyed: a last signal can come after the storm.
+    static const int made = sem_init(&arrived, 0, 0);
+    throwIfNegative(made, "create a semaphore");
     struct sigaction counting {};
-    counting.sa_handler = [](int) { ++handled; };
+    counting.sa_handler = [](int) {
+        const int error = errno;
+        ++handled;
+        sem_post(&arrived);
+        errno = error;
+    };
     throwIfNegative(sigaction(SIGUSR2, &counting, nullptr), "handle a signal");
     sigevent event{};
     event.sigev_notify = SIGEV_THREAD_ID;
@@ -28,10 +35,11 @@ SignalStorm::SignalStorm() {
 SignalStorm::~SignalStorm() { timer_delete(timer); }
 
 void SignalStorm::waitFor(int more) const {
-    // What a signal handler may do does not include waking a waiter.
-    constexpr std::chrono::milliseconds signalPeriod{1};
-    for (const int end = handled + more; handled < end;) {
-        std::this_thread::sleep_for(signalPeriod);
+    while (sem_trywait(&arrived) == 0) {
+        // Came before it was waited for.
+    }
+    while (more > 0) {
+        more -= sem_wait(&arrived) == 0 ? 1 : 0;
     }
 }
 

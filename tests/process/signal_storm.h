@@ -1,5 +1,7 @@
 #pragma once
 
+#include <semaphore.h>
+
 #include <atomic>
 #include <ctime>
 
@@ -14,7 +16,7 @@ public:
     SignalStorm& operator=(const SignalStorm&) = delete;
     ~SignalStorm();
 
-    // Waits for so many more signals; for other threads than the one that gets them.
+    // Waits for so many more signals; for one other thread at a time than the one that gets them.
     void waitFor(int more) const;
 
     // The signals since the storm began.
@@ -22,6 +24,7 @@ public:
 
 private:
     inline static std::atomic<int> handled{0};
+    inline static sem_t arrived{};
     timer_t timer{};
 };
 
