@@ -58,13 +58,15 @@
  *
  *  8. Events. Call enableRAIDEvent (start at the newest event) or setRAIDEventSequenceNumber
  *     (resume), then again and again getEvent, getRAIDEventCount and the event accessors.
- *     Four pitfalls:
+ *     Five pitfalls:
  *       - A cancelled or failed getEvent publishes the previous batch once more and advances the
  *         next number by its size. After each batch call setRAIDEventSequenceNumber with the last
  *         sequence number seen plus one, and pass over events whose number was seen before.
  *       - After a malformed answer getEvent leaves the list empty and the number as it was.
  *       - Every exchange that starts clears `endFlag`, also one of the inventory thread. A cancel
  *         can be lost to it, so repeat cancelGetEvent until getEvent has returned.
+ *       - A cancel ends every exchange that is waiting, also one of the inventory thread, whose
+ *         lists then keep what they held.
  *       - The wait notices a cancel after its current slice of at most 5 seconds; a signal whose
  *         handler does nothing, sent to the event thread, ends the slice at once.
  *

@@ -45,7 +45,8 @@ class TwoThreads : public FreshLibrary {
 protected:
     TwoThreads() { EXPECT_EQ(simulator.readLine(), "raidsim: listening on 127.0.0.1:34572"); }
 
-    // Reads the configuration again and again, as an agent does.
+    // Reads the configuration again and again, as an agent does. A cancel ends whichever exchange
+    // is waiting, this one too: then the lists stay what they were.
     int readInventory() const {
         int refreshes = 0;
         while (!over) {
@@ -87,6 +88,7 @@ TEST_F(TwoThreads, WorkSideBySideWithCancelsAtAnyMoment) {
     SCOPED_TRACE("RAID_TEST_SEED=" + std::to_string(seed));
     std::mt19937 random(seed);
     std::uniform_int_distribution<int> microseconds(0, 20'000);
+    ASSERT_EQ(getRAIDDiskDriveCount(), 6);
     const auto before = openDescriptors();
 
     BlockedCall inventory([this] { return readInventory(); });
