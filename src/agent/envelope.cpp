@@ -11,7 +11,7 @@
 #include "base/decimal.h"
 #include "diag/log.h"
 #include "xml/raid_xml_error.h"
-#include "xml/unit.h"
+#include "xml/unit_reader.h"
 
 RAIDSystem* raidSystem = nullptr;
 RAIDEvents* raidEvents = nullptr;

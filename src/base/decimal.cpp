@@ -13,7 +13,7 @@ constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
 }  // namespace
 
-int decimalNumber(std::string_view text) noexcept {
+int anyDecimalNumber(std::string_view text) noexcept {
     text.remove_prefix(std::min(text.find_first_not_of(whiteSpace), text.size()));
     const bool negative = text.starts_with('-');
     if (negative || text.starts_with('+')) {

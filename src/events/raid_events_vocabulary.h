@@ -12,7 +12,7 @@ struct raid::xml::Vocabulary<RAIDEvent> {
                                             .entry = "RAIDEvent Constructor\n",
                                             .exit = "Exit RAIDEvent Constructor\n"};
     static constexpr auto type = &RAIDEvent::eventType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         text("as:serverName", &RAIDEvent::serverName),
         text("as:serverAddress", &RAIDEvent::serverAddress),
         text("as:date", &RAIDEvent::date),
@@ -36,7 +36,7 @@ struct raid::xml::Vocabulary<RAIDEvents> {
                                              .entry = "RAIDEvents Constructor\n",
                                              .exit = "Exit RAIDEvents Constructor\n"};
     static constexpr auto type = &RAIDEvents::eventsType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         each<&RAIDEvents::events>("ac:event"),
     };
 };

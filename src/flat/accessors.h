@@ -33,7 +33,7 @@ consteval std::string Record::*textMember(std::string_view element) {
     if (element == "xsi:type") {
         return xml::Vocabulary<Record>::type;
     }
-    for (const auto& child : xml::Vocabulary<Record>::children) {
+    for (const auto& child : xml::childrenOf<Record>) {
         if (child.name == element && child.text != nullptr) {
             return child.text;
         }

@@ -93,7 +93,10 @@ void publish(const RAIDAdapter& adapter) {
     if (family.list != nullptr) {
         family.list->push_back(adapter);
     }
-    const auto members = family.looksUpArrays ? std::optional<ArrayMembers>(adapter) : std::nullopt;
+    std::optional<ArrayMembers> members;
+    if (family.looksUpArrays) {
+        members.emplace(adapter);
+    }
     const auto* const lookup = members ? &*members : nullptr;
     for (const auto& channel : Navigation::channels(adapter)) {
         publish(channel, lookup);
@@ -107,18 +110,20 @@ void publish(const RAIDAdapter& adapter) {
 
 }  // namespace
 
-int getConfig() {
-    getRAIDXML();
-    raid::base::store(refresh, static_cast<unsigned char>(0));
-    const auto* const system = getRAIDSystem();
-    if (system == nullptr) {
-        return 0;
-    }
+void raid::flat::publish(const RAIDSystem& system) {
     clearAll(PellionAdapterList, LSIAdapterList, VantryAdapterList, ChannelList, RAIDArrayList,
              SpannedRAIDArrayList, RAIDLogicalDriveList, RAIDDiskDriveList, RAIDEnclosureDeviceList,
              RAIDFanList, RAIDPowerSupplyList, RAIDTempSensorList);
-    for (const auto& adapter : Navigation::adapters(*system)) {
-        publish(adapter);
+    for (const auto& adapter : Navigation::adapters(system)) {
+        ::publish(adapter);
+    }
+}
+
+int getConfig() {
+    getRAIDXML();
+    raid::base::store(refresh, static_cast<unsigned char>(0));
+    if (const auto* const system = getRAIDSystem()) {
+        raid::flat::publish(*system);
     }
     return 0;
 }

@@ -14,7 +14,7 @@ struct raid::xml::Vocabulary<RAIDBasicArray> {
                                                  .entry = "RAIDBasicArray Constructor\n",
                                                  .exit = "Exit RAIDSystem Constructor\n"};
     static constexpr auto type = &RAIDBasicArray::basicArrayType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         flag("as:isSubArray", &RAIDBasicArray::isSubArray),
         number("as:type", &RAIDBasicArray::type),
         number("as:stripeSize", &RAIDBasicArray::stripeSize),
@@ -40,7 +40,7 @@ struct raid::xml::Vocabulary<RAIDSpannedArray> {
     static constexpr auto type = &RAIDSpannedArray::spannedArrayType;
     // At this depth reading, copying and destroying fit in 512 KiB of stack in every build.
     static constexpr int nestingLimit = 256;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:type", &RAIDSpannedArray::type),
         number("as:stripeSize", &RAIDSpannedArray::stripeSize),
         number("as:overallStatus", &RAIDSpannedArray::overallStatus),
@@ -62,7 +62,7 @@ struct raid::xml::Vocabulary<RAIDArrays> {
                                              .entry = "RAIDArrays Constructor\n",
                                              .exit = "Exit RAIDArrays Constructor\n"};
     static constexpr auto type = &RAIDArrays::arraysType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:overallStatus", &RAIDArrays::overallStatus),
         each<&RAIDArrays::basicArray>("ac:basicArray"),
         each<&RAIDArrays::spannedArray>("ac:spannedArray"),

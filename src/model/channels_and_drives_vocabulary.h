@@ -14,7 +14,7 @@ struct raid::xml::Vocabulary<RAIDHardDrive> {
                                                 .entry = "RAIDHardDrive Constructor\n",
                                                 .exit = "Exit RAIDHardDrive Constructor\n"};
     static constexpr auto type = &RAIDHardDrive::hardDriveType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         text("as:firmwareLevel", &RAIDHardDrive::firmwareLevel),
         text("as:vendor", &RAIDHardDrive::vendor),
         number("as:type", &RAIDHardDrive::type),
@@ -46,7 +46,7 @@ struct raid::xml::Vocabulary<RAIDChannel> {
                                               .entry = "RAIDChannel Constructor\n",
                                               .exit = "Exit RAIDChannel Constructor\n"};
     static constexpr auto type = &RAIDChannel::channelType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:initiatorID", &RAIDChannel::initiatorID),
         number("as:channelID", &RAIDChannel::channelID),
         number("as:type", &RAIDChannel::type),
@@ -66,7 +66,7 @@ struct raid::xml::Vocabulary<RAIDPhysicalDrives> {
         .entry = "RAIDPhysicalDrives Constructor\n",
         .exit = "Exit RAIDPhysicalDrives Constructor\n"};
     static constexpr auto type = &RAIDPhysicalDrives::physicalDrivesType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:overallStatus", &RAIDPhysicalDrives::overallStatus),
         each<&RAIDPhysicalDrives::channels>("ac:channel"),
     };
@@ -80,7 +80,7 @@ struct raid::xml::Vocabulary<RAIDHotSpareDrives> {
         .entry = "RAIDHotSpareDrives Constructor\n",
         .exit = "Exit RAIDHotSpareDrives Constructor\n"};
     static constexpr auto type = &RAIDHotSpareDrives::hotSpareDrivesType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:overallStatus", &RAIDHotSpareDrives::overallStatus),
         each<&RAIDHotSpareDrives::hardDrives>("ac:hardDrive"),
     };

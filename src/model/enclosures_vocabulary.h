@@ -12,7 +12,7 @@ struct raid::xml::Vocabulary<RAIDFan> {
                                           .entry = "RAIDFan Constructor\n",
                                           .exit = "Exit RAIDFan Constructor\n"};
     static constexpr auto type = &RAIDFan::fanType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:index", &RAIDFan::index),
         number("as:status", &RAIDFan::status),
     };
@@ -25,7 +25,7 @@ struct raid::xml::Vocabulary<RAIDPowerSupply> {
                                                   .entry = "RAIDPowerSupply Constructor\n",
                                                   .exit = "Exit RAIDPowerSupply Constructor\n"};
     static constexpr auto type = &RAIDPowerSupply::powerSupplyType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:index", &RAIDPowerSupply::index),
         number("as:status", &RAIDPowerSupply::status),
     };
@@ -38,7 +38,7 @@ struct raid::xml::Vocabulary<RAIDTempSensor> {
                                                  .entry = "RAIDTempSensor Constructor\n",
                                                  .exit = "Exit RAIDTempSensor Constructor\n"};
     static constexpr auto type = &RAIDTempSensor::tempSensorType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:index", &RAIDTempSensor::index),
         number("as:status", &RAIDTempSensor::status),
     };
@@ -51,7 +51,7 @@ struct raid::xml::Vocabulary<RAIDDeviceSlotID> {
                                                    .entry = "RAIDDeviceSlotID Constructor\n",
                                                    .exit = "Exit RAIDDeviceSlotID Constructor\n"};
     static constexpr auto type = &RAIDDeviceSlotID::deviceSlotIDType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:index", &RAIDDeviceSlotID::index),
         number("as:slotID", &RAIDDeviceSlotID::slotID),
     };
@@ -65,7 +65,7 @@ struct raid::xml::Vocabulary<RAIDEnclosureDevice> {
         .entry = "RAIDEnclosureDevice Constructor\n",
         .exit = "Exit RAIDEnclosureDevice Constructor\n"};
     static constexpr auto type = &RAIDEnclosureDevice::enclosureDeviceType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:adapterID", &RAIDEnclosureDevice::adapterID),
         number("as:logicalID", &RAIDEnclosureDevice::logicalID),
         number("as:channelID", &RAIDEnclosureDevice::channelID),

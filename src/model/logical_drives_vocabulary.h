@@ -39,7 +39,7 @@ struct raid::xml::Vocabulary<RAIDLogicalDrive> {
                                                    .entry = "RAIDLogicalDrive Constructor\n",
                                                    .exit = "Exit RAIDLogicalDrive Constructor\n"};
     static constexpr auto type = &RAIDLogicalDrive::logicalDriveType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:overallStatus", &RAIDLogicalDrive::overallStatus),
         number("as:type", &RAIDLogicalDrive::type),
         number("as:stripeUnitSize", &RAIDLogicalDrive::stripeUnitSize),
@@ -68,7 +68,7 @@ struct raid::xml::Vocabulary<RAIDLogicalDrives> {
                                                     .entry = "RAIDLogicalDrives Constructor\n",
                                                     .exit = "Exit RAIDLogicalDrives Constructor\n"};
     static constexpr auto type = &RAIDLogicalDrives::logicalDrivesType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         number("as:overallStatus", &RAIDLogicalDrives::overallStatus),
         each<&RAIDLogicalDrives::logicalDrive>("ac:logicalDrive"),
     };

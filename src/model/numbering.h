@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <memory_resource>
 #include <optional>
 #include <unordered_map>
 
@@ -24,8 +25,10 @@ public:
     [[nodiscard]] std::optional<int> arrayOf(const RAIDLogicalDrive& drive) const;
 
 private:
-    std::unordered_map<std::uint64_t, int> arrayOfDrive;
-    std::unordered_map<int, int> arrayOfLogicalDrive;
+    // Filled once and dropped whole, so that the entries need no freeing one by one.
+    std::pmr::monotonic_buffer_resource storage;
+    std::pmr::unordered_map<std::uint64_t, int> arrayOfDrive{&storage};
+    std::pmr::unordered_map<int, int> arrayOfLogicalDrive{&storage};
 };
 
 }  // namespace raid

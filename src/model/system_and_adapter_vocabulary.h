@@ -16,7 +16,7 @@ struct raid::xml::Vocabulary<RAIDAdapter> {
                                               .exit = "Exit RAIDSystem Constructor\n",
                                               .context = "RAIDSystem"};
     static constexpr auto type = &RAIDAdapter::adapterType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         flag("as:hotSwapRebuild", &RAIDAdapter::hotSwapRebuild),
         number("as:stripeUnitSize", &RAIDAdapter::stripeUnitSize),
         number("as:batteryStatus", &RAIDAdapter::batteryStatus),
@@ -70,7 +70,7 @@ struct raid::xml::Vocabulary<RAIDSystem> {
                                              .context = "system",
                                              .detail = &RAIDSystem::name};
     static constexpr auto type = &RAIDSystem::systemType;
-    static constexpr std::array children{
+    static constexpr std::tuple children{
         each<&RAIDSystem::adapters>("ac:adapter"),
         text("as:osVersion", &RAIDSystem::osVersion),
         text("as:os", &RAIDSystem::os),

@@ -1,11 +1,13 @@
 #pragma once
 
 #include <algorithm>
+#include <array>
 #include <string>
 #include <string_view>
 
 #include "base/decimal.h"
 #include "diag/log.h"
+#include "xml/name_index.h"
 #include "xml/raid_xml_error.h"
 #include "xml/vocabulary.h"
 
@@ -38,13 +40,33 @@ private:
     UnitReader& units;
 };
 
+// What a name is to a class that is not one of its children.
+inline constexpr int ownName = -1;
+inline constexpr int unknownName = -2;
+
+/// The names of the children, and the element's own behind them.
 template <class Model>
-const Child<Model>* findChild(std::string_view name) {
-    const auto& children = Vocabulary<Model>::children;
-    const auto* const found =
-        std::ranges::find(children, name, [](const auto& child) { return child.name; });
-    return found == children.end() ? nullptr : found;
+inline constexpr auto indexOf = [] {
+    constexpr auto& children = childrenOf<Model>;
+    std::array<std::string_view, children.size() + 1> names;
+    std::ranges::transform(children, names.begin(), [](const auto& child) { return child.name; });
+    names.back() = Vocabulary<Model>::words.element;
+    return NameIndex(names);
+}();
+
+/// The row of the child, or what else the name is to the class.
+template <class Model>
+int numberOf(std::string_view name) {
+    constexpr auto count = childrenOf<Model>.size();
+    const auto place = indexOf<Model>.find(name);
+    if (place < count) {
+        return static_cast<int>(place);
+    }
+    return place == count ? ownName : unknownName;
 }
+
+template <class Model>
+inline constexpr Names namesOf{&numberOf<Model>, seedOf(Vocabulary<Model>::words.element)};
 
 template <class Model>
 void keepText(Model& model, const Child<Model>& child, std::string_view text) {
@@ -69,12 +91,18 @@ void readSimple(Model& model, const Child<Model>& child, UnitReader& units, cons
     if (start.closing) {
         return;
     }
+    if (const auto plain = units.plainText(child.name)) {
+        if (!plain->empty()) {
+            keepText(model, child, *plain);
+        }
+        return;
+    }
     auto unit = units.next();
-    if (!unit.isTag && !unit.isUnfinished()) {
+    if (!unit.isTag && unit.finished) {
         keepText(model, child, unit.name);
         unit = units.next();
     }
-    const bool ends = unit.isTag && !unit.isUnfinished() && unit.closing && unit.name == child.name;
+    const bool ends = unit.isTag && unit.finished && unit.closing && unit.name == child.name;
     if (!ends) {
         throwMissingEnd(child.endWord, unit);
     }
@@ -96,7 +124,7 @@ void passOver(UnitReader& units) {
     constexpr auto& words = Vocabulary<Model>::words;
     for (;;) {
         const auto unit = units.next();
-        if (unit.isUnfinished()) {
+        if (!unit.finished) {
             throwMissingEnd(words.endWord, unit);
         }
         if (unit.isTag && unit.closing && !unit.opening && unit.name == words.element) {
@@ -105,31 +133,39 @@ void passOver(UnitReader& units) {
     }
 }
 
+/// Anything but the start of a known child must be the element's own end.
+template <class Model>
+void requireEnd(const NamedUnit& found) {
+    constexpr auto& words = Vocabulary<Model>::words;
+    const auto& [unit, number] = found;
+    if (!unit.finished) {
+        throwMissingEnd(words.endWord, unit);
+    }
+    if (!unit.isTag || number == unknownName) {
+        throwUnknown(unit);
+    }
+    if (number != ownName) {
+        throwMissingEnd(words.endWord, unit);
+    }
+    if (!unit.closing) {
+        throwMissingEnd("name", unit);
+    }
+}
+
 template <class Model>
 void readChildren(Model& model, UnitReader& units) {
-    constexpr auto& words = Vocabulary<Model>::words;
-    for (;;) {
-        const auto unit = units.next();
-        if (unit.isUnfinished()) {
-            throwMissingEnd(words.endWord, unit);
+    while (!units.passEnd(Vocabulary<Model>::words.element)) {
+        const auto& found = units.next(namesOf<Model>);
+        const auto& [unit, number] = found;
+        if (number < 0 || !unit.opening || !unit.finished) {
+            requireEnd<Model>(found);
+            return;
         }
-        if (unit.isTag && unit.name == words.element) {
-            if (unit.closing) {
-                return;
-            }
-            throwMissingEnd("name", unit);
-        }
-        const auto* const child = unit.isTag ? findChild<Model>(unit.name) : nullptr;
-        if (child == nullptr) {
-            throwUnknown(unit);
-        }
-        if (!unit.opening) {
-            throwMissingEnd(words.endWord, unit);
-        }
-        if (child->read != nullptr) {
-            child->read(model, units, unit);
+        const auto& child = childrenOf<Model>[static_cast<std::size_t>(number)];
+        if (child.read != nullptr) {
+            child.read(model, units, unit);
         } else {
-            readSimple(model, *child, units, unit);
+            readSimple(model, child, units, unit);
         }
     }
 }
@@ -137,7 +173,7 @@ void readChildren(Model& model, UnitReader& units) {
 template <class Model>
 void readContent(Model& model, UnitReader& units, const Unit& start) {
     constexpr auto& words = Vocabulary<Model>::words;
-    if (start.isUnfinished()) {
+    if (!start.finished) {
         throwMissingEnd(words.endWord, start);
     }
     if (!start.isTag || !start.opening || start.name != words.element) {

@@ -44,19 +44,26 @@ public:
     }
 
 private:
+    static constexpr ByteSet nameEnds =
+        bytesThat([](std::size_t byte) { return byte == '>' || byte == '/' || spaceBytes[byte]; });
+    static constexpr ByteSet attributeNameEnds =
+        bytesThat([](std::size_t byte) { return byte == '=' || spaceBytes[byte]; });
+
     static bool isNoSpace(char c) noexcept { return !isSpaceByte(c); }
 
     /// Moves to the first character that stops the place; false at the end of the input.
     template <class Stop>
     bool skip(Place place, Stop stops) {
-        for (; at != end; ++at) {
+        for (const char* here = at; here != end; ++here) {
             if constexpr (Sink::tracesCharacters) {
-                sink.character(place, *at);
+                sink.character(place, *here);
             }
-            if (stops(*at)) {
+            if (stops(*here)) {
+                at = here;
                 return true;
             }
         }
+        at = end;
         return false;
     }
 
@@ -99,8 +106,7 @@ private:
         endTag ? sink.closes() : sink.opens();
         const char* const name = endTag ? at + 1 : at;
         ++at;
-        if (!skip(Place::elementName,
-                  [](char c) { return c == '>' || c == '/' || isSpaceByte(c); })) {
+        if (!skip(Place::elementName, [](char c) { return contains(nameEnds, c); })) {
             return 0;
         }
         sink.element(since(name));
@@ -141,7 +147,7 @@ private:
     /// it up to the next "=" and quote.
     bool attribute() {
         const char* const nameStart = at++;
-        if (!skip(Place::attributeName, [](char c) { return c == '=' || isSpaceByte(c); })) {
+        if (!skip(Place::attributeName, [](char c) { return contains(attributeNameEnds, c); })) {
             return false;
         }
         const auto name = since(nameStart);

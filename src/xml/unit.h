@@ -64,12 +64,9 @@ struct Unit {
     bool isTag = false;
     bool opening = false;
     bool closing = false;
-    int consumed = 0;
+    bool finished = false;  // or else the document ended before the unit did
     std::string_view name;
     std::string_view type;  // value of the last "xsi:type" attribute
-
-    /// The document ended before the unit did.
-    [[nodiscard]] bool isUnfinished() const noexcept { return consumed == 0; }
 };
 
 /// Fills a Unit from a scan.
@@ -92,44 +89,6 @@ public:
 
 private:
     Unit& unit;
-};
-
-/// A document read unit by unit.
-class UnitReader {
-public:
-    UnitReader(const char* text, int length) noexcept : start(text), at(text), left(length) {}
-
-    /// The next unit. An unfinished unit is returned again and again: the reader stays before it.
-    Unit next() {
-        Unit unit;
-        UnitSink sink(unit);
-        unit.consumed = readUnit(at, left, sink);
-        at += unit.consumed;
-        left -= unit.consumed;
-        return unit;
-    }
-
-    /// The unit that was read last once more, which shows in the trace alone.
-    Unit again(const Unit& last) {
-        if (!diag::passes(diag::readingLevel)) {
-            return last;
-        }
-        at -= last.consumed;
-        left += last.consumed;
-        return next();
-    }
-
-    [[nodiscard]] int consumed() const noexcept { return static_cast<int>(at - start); }
-    [[nodiscard]] const char* position() const noexcept { return at; }
-    [[nodiscard]] int remaining() const noexcept { return left; }
-
-    /// Levels of self-containing elements around the current one.
-    int nesting = 0;
-
-private:
-    const char* start;
-    const char* at;
-    int left;
 };
 
 }  // namespace raid::xml

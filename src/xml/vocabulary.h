@@ -3,12 +3,13 @@
 #include <array>
 #include <string>
 #include <string_view>
+#include <tuple>
 #include <type_traits>
 #include <utility>
 #include <vector>
 
 #include "model/blank.h"
-#include "xml/unit.h"
+#include "xml/unit_reader.h"
 
 namespace raid::xml {
 
@@ -41,7 +42,8 @@ struct Words {
 ///
 ///     words          what it is called
 ///     type           the member that keeps the "xsi:type" attribute
-///     children       its vocabulary, one row a child; without it the element's content is passed
+///     children       its vocabulary, a tuple with one row a child; without it the element's
+///     content is passed
 ///                    over up to its own end tag
 ///     nestingLimit   for an element that can contain itself: how deep
 template <class Model>
@@ -116,34 +118,82 @@ struct MemberOf<Member> {
 
 /// An element that is appended to a list each time it occurs.
 template <auto List>
-constexpr auto each(std::string_view name) {
+struct Each {
     using Model = typename MemberOf<List>::Model;
-    return Child<Model>{.name = name,
-                        .read = [](Model& parent, UnitReader& units, const Unit& start) {
-                            readElement(Unread::appendTo(parent.*List), units, start);
-                        }};
-}
+    static constexpr auto list = List;
+
+    template <class Read>
+    static void keep(Model& parent, Read read) {
+        read(Unread::appendTo(parent.*list));
+    }
+
+    std::string_view name;
+};
 
 /// An element that is kept whole; a later one replaces it.
 template <auto Member>
-constexpr auto one(std::string_view name) {
+struct One {
     using Model = typename MemberOf<Member>::Model;
     using Item = typename MemberOf<Member>::Type;
-    return Child<Model>{.name = name,
-                        .read = [](Model& parent, UnitReader& units, const Unit& start) {
-                            auto item = Unread::make<Item>();
-                            readElement(item, units, start);
-                            parent.*Member = std::move(item);
-                        }};
-}
+    static constexpr auto member = Member;
+
+    template <class Read>
+    static void keep(Model& parent, Read read) {
+        auto item = Unread::make<Item>();
+        read(item);
+        parent.*member = std::move(item);
+    }
+
+    std::string_view name;
+};
 
 /// An element that must be well-formed and is not kept.
+template <class OfModel, class OfItem>
+struct Passed {
+    using Model = OfModel;
+    using Item = OfItem;
+
+    template <class Read>
+    static void keep(Model& /*parent*/, Read read) {
+        auto item = Unread::make<Item>();
+        read(item);
+    }
+
+    std::string_view name;
+};
+
+template <auto List>
+constexpr Each<List> each(std::string_view name) {
+    return {name};
+}
+
+template <auto Member>
+constexpr One<Member> one(std::string_view name) {
+    return {name};
+}
+
 template <class Model, class Item>
-constexpr Child<Model> passed(std::string_view name) {
-    return {.name = name, .read = [](Model& /*parent*/, UnitReader& units, const Unit& start) {
-                auto item = Unread::make<Item>();
-                readElement(item, units, start);
+constexpr Passed<Model, Item> passed(std::string_view name) {
+    return {name};
+}
+
+// What the loop that reads elements makes of the rows.
+
+template <class Model>
+constexpr Child<Model> asChild(const Child<Model>& row) {
+    return row;
+}
+
+template <class Row>
+constexpr Child<typename Row::Model> asChild(const Row& row) {
+    return {.name = row.name,
+            .read = [](typename Row::Model& parent, UnitReader& units, const Unit& start) {
+                Row::keep(parent, [&](auto& item) { readElement(item, units, start); });
             }};
 }
+
+template <class Model>
+inline constexpr auto childrenOf = std::apply(
+    [](const auto&... rows) { return std::array{asChild(rows)...}; }, Vocabulary<Model>::children);
 
 }  // namespace raid::xml

@@ -23,7 +23,7 @@ public:
         std::string lines = line("", Vocabulary<Model>::words.element, sizeof(Model));
         lines += member("xsi:type", Vocabulary<Model>::type);
         if constexpr (requires { Vocabulary<Model>::children; }) {
-            for (const auto& child : Vocabulary<Model>::children) {
+            for (const auto& child : xml::childrenOf<Model>) {
                 if (child.number != nullptr) {
                     lines += member(child.name, child.number);
                 } else if (child.text != nullptr) {

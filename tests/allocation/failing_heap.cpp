@@ -99,6 +99,20 @@ void operator delete[](void* block, const std::nothrow_t& /*nothrow*/) noexcept 
     operator delete(block);
 }
 
+void* operator new(std::size_t size, std::align_val_t alignment) {
+    void* block = nullptr;
+    if (!mayAllocate() || posix_memalign(&block, static_cast<std::size_t>(alignment), size) != 0) {
+        throw std::bad_alloc();
+    }
+    return counted(block);
+}
+void operator delete(void* block, std::align_val_t /*alignment*/) noexcept {
+    operator delete(block);
+}
+void operator delete(void* block, std::size_t /*size*/, std::align_val_t /*alignment*/) noexcept {
+    operator delete(block);
+}
+
 #else
 
 extern "C" {
@@ -106,6 +120,7 @@ extern "C" {
 void* __libc_malloc(std::size_t size);
 void* __libc_calloc(std::size_t count, std::size_t size);
 void* __libc_realloc(void* block, std::size_t size);
+void* __libc_memalign(std::size_t alignment, std::size_t size);
 void __libc_free(void* block);
 
 void* malloc(std::size_t size) noexcept {
@@ -114,6 +129,10 @@ void* malloc(std::size_t size) noexcept {
 
 void* calloc(std::size_t count, std::size_t size) noexcept {
     return mayAllocate() ? counted(__libc_calloc(count, size)) : nullptr;
+}
+
+void* aligned_alloc(std::size_t alignment, std::size_t size) noexcept {
+    return mayAllocate() ? counted(__libc_memalign(alignment, size)) : nullptr;
 }
 
 void* realloc(void* block, std::size_t size) noexcept {

@@ -88,6 +88,7 @@ TEST_F(TwoThreads, WorkSideBySideWithCancelsAtAnyMoment) {
     SCOPED_TRACE("RAID_TEST_SEED=" + std::to_string(seed));
     std::mt19937 random(seed);
     std::uniform_int_distribution<int> microseconds(0, 20'000);
+    RAIDinit();
     ASSERT_EQ(getRAIDDiskDriveCount(), 6);
     const auto before = openDescriptors();
 

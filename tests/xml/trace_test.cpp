@@ -3,6 +3,8 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "support/files.h"
 #include "support/fresh_library.h"
@@ -11,6 +13,21 @@
 namespace {
 
 using namespace raid::test;
+
+using TracedUnit = FreshLibrary;
+
+TEST_F(TracedUnit, IsTheSameUnit) {
+    writeLogLevel(9);
+    const std::string text = "<a b='c' d=\"e\"/>";
+    const ParseDefUnit unit(text.data(), static_cast<int>(text.size()));
+    EXPECT_EQ(unit.kind, 1);
+    EXPECT_EQ(unit.name, "a");
+    EXPECT_TRUE(unit.opening);
+    EXPECT_TRUE(unit.closing);
+    EXPECT_EQ(unit.consumed, static_cast<int>(text.size()));
+    const std::vector<std::pair<std::string, std::string>> attributes{{"b", "c"}, {"d", "e"}};
+    EXPECT_EQ(unit.attributes, attributes);
+}
 
 class TokenizerTrace : public FreshLibrary {
 protected:

@@ -26,6 +26,11 @@ int main(int argc, char** argv) {
             std::cout << help->text;
             return static_cast<int>(raidsim::ExitStatus::ok);
         }
+        if (const auto* const order = std::get_if<raidsim::generate::Order>(&wanted)) {
+            std::cout << raidsim::generate::generate(*order) << std::flush;
+            return static_cast<int>(std::cout ? raidsim::ExitStatus::ok
+                                              : raidsim::ExitStatus::cannotWrite);
+        }
         raidsim::Simulator simulator(std::get<raidsim::Options>(wanted), std::cout, std::cerr);
         simulator.run();
         return static_cast<int>(raidsim::ExitStatus::ok);

@@ -5,6 +5,8 @@
 #include <string>
 #include <variant>
 
+#include "generate/generate.h"
+
 namespace raidsim {
 
 struct Options {
@@ -25,7 +27,9 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+using Wanted = std::variant<Options, generate::Order, HelpWanted>;
+
 // Throws UsageError.
-[[nodiscard]] std::variant<Options, HelpWanted> parseOptions(int argc, const char* const* argv);
+[[nodiscard]] Wanted parseOptions(int argc, const char* const* argv);
 
 }  // namespace raidsim

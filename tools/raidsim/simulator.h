@@ -23,7 +23,8 @@ enum class ExitStatus {
     badInput = 65,
     noInput = 66,
     cannotListen = 69,
-    internal = 70
+    internal = 70,
+    cannotWrite = 74
 };
 
 // Why the program could not start.

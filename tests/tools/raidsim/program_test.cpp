@@ -129,6 +129,7 @@ struct FailingStart {
 const std::vector<FailingStart> failingStarts{
 
     {{}, "raidsim: CONFIG is required\n", 64},
+    {{"generate", "--drives", "-1"}, "raidsim: --drives: [^\n]*\n", 64},
     {{"--color", "system.xml"}, "raidsim: [^\n]*--color[^\n]*\n", 64},
     {{"--speed", "0", "system.xml"}, "raidsim: --speed: [^\n]*\n", 64},
     {{"--port", "65536", "system.xml"}, "raidsim: [^\n]*--port[^\n]*\n", 64},
@@ -163,6 +164,12 @@ TEST(Program, FailsToStartWithOneLineAndAStatus) {
         EXPECT_THAT(program.readErrors(), MatchesRegex(message));
         EXPECT_EQ(program.exitStatus(), status) << message;
     }
+}
+
+TEST(Program, WritesAGeneratedDocumentAndEnds) {
+    Program program({"generate", "--adapters", "0", "--compact"});
+    EXPECT_THAT(program.readOutput(), MatchesRegex("<\\?xml [^\n]*</env:Envelope>"));
+    EXPECT_EQ(program.exitStatus(), 0);
 }
 
 TEST(Program, HelpNamesEveryOption) {

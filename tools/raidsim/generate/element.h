@@ -12,6 +12,15 @@ namespace raidsim::generate {
 class Element {
 public:
     explicit Element(const std::string& xsiType) : tree(xml::element(xsiType)) {}
+    Element(const Element&) = default;
+    Element& operator=(const Element&) = default;
+    // A tree can be swapped, but not moved.
+    Element(Element&& other) { tree.swap(other.tree); }
+    Element& operator=(Element&& other) {
+        tree.swap(other.tree);
+        return *this;
+    }
+    ~Element() = default;
 
     Element& number(const char* field, int value) {
         return add(field, "xsd:int", std::to_string(value));
@@ -26,11 +35,11 @@ public:
     Element& flag(const char* field, bool value) {
         return add(field, "xsd:boolean", value ? "true" : "false");
     }
-    Element& child(const char* name, const Element& made) {
-        xml::addChild(tree, name, made.tree);
+    Element& child(const char* name, Element made) {
+        xml::addChild(tree, name).swap(made.tree);
         return *this;
     }
-    [[nodiscard]] xml::Tree take() { return tree; }
+    [[nodiscard]] xml::Tree& get() { return tree; }
 
 private:
     Element& add(const char* field, const char* xsiType, const std::string& value) {

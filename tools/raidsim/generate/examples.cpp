@@ -3,6 +3,8 @@
 #include <array>
 #include <utility>
 
+#include "generate/sized_rack.h"
+
 namespace raidsim::generate {
 
 namespace {
@@ -157,47 +159,7 @@ SystemPlan mixed() {
             {sharedAndSpanned(), mirrorOnly(), external(), striped(), unknownType()}};
 }
 
-constexpr int rackAdapters = 4;
-constexpr int rackChannels = 4;
-constexpr int rackShelves = 2;
-constexpr int shelfSlots = 12;
-constexpr int channelDrives = rackShelves * shelfSlots;
-
-// The last drive of each shelf is a hot spare, the others make an array.
-AdapterPlan rackAdapter(int id) {
-    AdapterPlan adapter{.xsiType = id % 2 == 1 ? "o:PellionAdapter" : "o:DorvelAdapter",
-                        .id = id,
-                        .typeName = id % 2 == 1 ? "Pellion 8480" : "Dorvel 800",
-                        .physicalSlot = id};
-    adapter.interface = Interface::sas;
-    adapter.memoryMegabytes = 512;
-    for (int channel = 0; channel < rackChannels; ++channel) {
-        ChannelPlan plan{channel, Interface::sas, serialScsi, drives(channelDrives, ostrel300), {}};
-        for (int shelf = 0; shelf < rackShelves; ++shelf) {
-            const int first = shelf * shelfSlots;
-            const int number = channel * rackShelves + shelf;
-            plan.drives[static_cast<std::size_t>(first + shelfSlots - 1)].state =
-                DriveState::hotSpare;
-            plan.enclosures.push_back(
-                {100 + shelf, number, "HALVOR", "HV-12E", 3, 2, 2, slots(shelfSlots)});
-            ArrayPlan array{.id = number,
-                            .name = "Shelf " + std::to_string(number),
-                            .members = places(channel, first, shelfSlots - 1)};
-            array.logicals =
-                raid5(number, "Volume " + std::to_string(number), 286000, shelfSlots - 1);
-            adapter.arrays.push_back(std::move(array));
-        }
-        adapter.channels.push_back(std::move(plan));
-    }
-    return adapter;
-}
-
-SystemPlan largeRack() {
-    SystemPlan plan{"rack-07", "Linux", "2.6.18-8.el5PAE", {}};
-    for (int id = 1; id <= rackAdapters; ++id)
-        plan.adapters.push_back(rackAdapter(id));
-    return plan;
-}
+SystemPlan largeRack() { return sizedRack({.adapters = 4, .channels = 4, .drives = 24}); }
 
 constexpr std::array<Example, 3> all{{
     {"small-server.xml", smallServer},

@@ -109,7 +109,7 @@ Element physicalDrives(const AdapterPlan& adapter) {
             channel.child("ac:hardDrive", drive(adapter, plan, each));
         for (const EnclosurePlan& each : plan.enclosures)
             channel.child("ac:enclosure", enclosure(adapter, plan, each));
-        made.child("ac:channel", channel);
+        made.child("ac:channel", std::move(channel));
     }
     return made;
 }
@@ -210,9 +210,9 @@ void addMembers(Element& array, const AdapterPlan& adapter, const ArrayPlan& pla
             any = true;
         }
         if (any)
-            physical.child("ac:channel", listed);
+            physical.child("ac:channel", std::move(listed));
     }
-    array.child("ac:physicalDrives", physical);
+    array.child("ac:physicalDrives", std::move(physical));
 }
 
 Element arrayFields(const AdapterPlan& adapter, const char* xsiType, int id,
@@ -249,7 +249,7 @@ Element spannedArray(const AdapterPlan& adapter, const SpannedPlan& plan) {
     Element made = arrayFields(adapter, "o:SpannedArray", plan.id, plan.name, "", 1);
     made.number("size", size).number("freeSpace", std::max(0, size - usedBy(plan.logicals)));
     made.child("ac:logicalDrives", logicalDrives(adapter, pointers(plan.logicals)));
-    made.child("ac:arrays", inner);
+    made.child("ac:arrays", std::move(inner));
     return made;
 }
 
@@ -336,7 +336,7 @@ xml::Tree document(const SystemPlan& plan) {
     for (const AdapterPlan& each : plan.adapters)
         system.child("ac:adapter", adapter(each));
     xml::Tree content;
-    xml::addChild(content, "ac:system", system.take());
+    xml::addChild(content, "ac:system").swap(system.get());
     return soap::envelope("m:getConfigResponse", content);
 }
 

@@ -20,14 +20,11 @@ constexpr std::array<std::pair<const char*, const char*>, 7> namespaces{{
 }  // namespace
 
 xml::Tree envelope(const std::string& response, const xml::Tree& content) {
-    xml::Tree body;
-    xml::addChild(body, response, content);
-    xml::Tree outer;
+    xml::Tree document;
+    xml::Tree& outer = xml::addChild(document, "env:Envelope");
     for (const auto& [name, uri] : namespaces)
         xml::addAttribute(outer, name, uri);
-    xml::addChild(outer, "env:Body", body);
-    xml::Tree document;
-    xml::addChild(document, "env:Envelope", outer);
+    xml::addChild(xml::addChild(outer, "env:Body"), response, content);
     return document;
 }
 

@@ -2,6 +2,7 @@
 
 #include <boost/property_tree/xml_parser.hpp>
 #include <sstream>
+#include <utility>
 
 #include "xml/well_formed.h"
 
@@ -42,26 +43,52 @@ void appendAttributes(std::string& out, const Tree& attributes) {
     }
 }
 
-void appendElement(std::string& out, const std::string& name, const Tree& element,
-                   std::size_t depth) {
-    const std::string indent(2 * depth, ' ');
-    out.append(indent).append(1, '<').append(name);
-    const Tree* const attributes = childOf(element, attributesKey);
-    if (attributes != nullptr)
-        appendAttributes(out, *attributes);
-    out += '>';
-    appendEscaped(out, element.data());
-    const std::size_t children = element.size() - (attributes != nullptr ? 1U : 0U);
-    if (children != 0) {
-        out += '\n';
-        for (const auto& [childName, child] : element) {
-            if (childName != attributesKey)
-                appendElement(out, childName, child, depth + 1);
-        }
-        out += indent;
+class Writer {
+public:
+    explicit Writer(Layout wanted) : layout(wanted) {}
+
+    std::string write(const Tree& document) {
+        endLine();
+        for (const auto& [name, child] : document)
+            append(name, child, 0);
+        return std::move(out);
     }
-    out.append("</").append(name).append(">\n");
-}
+
+private:
+    void append(const std::string& name, const Tree& element, std::size_t depth) {
+        indent(depth);
+        out.append(1, '<').append(name);
+        const Tree* const attributes = childOf(element, attributesKey);
+        if (attributes != nullptr)
+            appendAttributes(out, *attributes);
+        out += '>';
+        appendEscaped(out, element.data());
+        const std::size_t children = element.size() - (attributes != nullptr ? 1U : 0U);
+        if (children != 0) {
+            endLine();
+            for (const auto& [childName, child] : element) {
+                if (childName != attributesKey)
+                    append(childName, child, depth + 1);
+            }
+            indent(depth);
+        }
+        out.append("</").append(name).append(1, '>');
+        endLine();
+    }
+
+    void indent(std::size_t depth) {
+        if (layout == Layout::indented)
+            out.append(2 * depth, ' ');
+    }
+
+    void endLine() {
+        if (layout == Layout::indented)
+            out += '\n';
+    }
+
+    Layout layout;
+    std::string out = "<?xml version=\"1.0\" encoding=\"utf-8\"?>";
+};
 
 // The blanks between the children of an element arrive as its text.
 void dropIndentation(Tree& element) {
@@ -87,12 +114,7 @@ Tree parse(std::string_view text) {
     return document;
 }
 
-std::string format(const Tree& document) {
-    std::string out = "<?xml version=\"1.0\" encoding=\"utf-8\"?>\n";
-    for (const auto& [name, child] : document)
-        appendElement(out, name, child, 0);
-    return out;
-}
+std::string format(const Tree& document, Layout layout) { return Writer(layout).write(document); }
 
 Tree element(const std::string& xsiType) {
     Tree made;
@@ -107,8 +129,8 @@ void addAttribute(Tree& element, const std::string& name, const std::string& val
     attributes->push_back({name, Tree(value)});
 }
 
-void addChild(Tree& parent, const std::string& name, const Tree& child) {
-    parent.push_back({name, child});
+Tree& addChild(Tree& parent, const std::string& name, const Tree& child) {
+    return parent.push_back({name, child})->second;
 }
 
 void addText(Tree& parent, const std::string& name, const std::string& xsiType,

@@ -22,13 +22,18 @@ public:
 // Reads a whole well-formed document; comments are dropped. Throws XmlError.
 [[nodiscard]] Tree parse(std::string_view text);
 
-// Writes a document with its prolog, two blanks of indentation per level. Only the characters
-// that must be escaped are; an empty element is written as a start tag and an end tag.
-[[nodiscard]] std::string format(const Tree& document);
+enum class Layout {
+    indented,  // an element a line, two blanks a level
+    compact    // all in one line
+};
+
+// Writes a document with its prolog. Only the characters that must be escaped are; an empty
+// element is written as a start tag and an end tag.
+[[nodiscard]] std::string format(const Tree& document, Layout layout = Layout::indented);
 
 [[nodiscard]] Tree element(const std::string& xsiType);
 void addAttribute(Tree& element, const std::string& name, const std::string& value);
-void addChild(Tree& parent, const std::string& name, const Tree& child);
+Tree& addChild(Tree& parent, const std::string& name, const Tree& child = {});
 
 // A simple child with its xsi:type ("xsd:int", "xsd:string", "xsd:boolean").
 void addText(Tree& parent, const std::string& name, const std::string& xsiType,
