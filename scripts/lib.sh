@@ -9,6 +9,7 @@ jobs=$(nproc)
 export PYTHONDONTWRITEBYTECODE=1
 buildPackages=(cmake g++ libboost-dev libcli11-dev ninja-build nlohmann-json3-dev)
 testPackages=(g++-multilib googletest pkgconf)
+benchPackages=(g++-multilib libbenchmark-dev libexpat1-dev libpugixml-dev librapidxml-dev libxml2-dev python3)
 checkPackages=(clang clang-format clang-tidy shellcheck)
 abiPackages=(abigail-tools)
 coveragePackages=(gcovr python3)

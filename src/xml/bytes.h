@@ -18,7 +18,7 @@ using Word = std::size_t;
 inline constexpr std::size_t wordBytes = sizeof(Word);
 
 [[nodiscard]] inline Word wordAt(const char* at) noexcept {
-    Word word;
+    Word word = 0;
     std::memcpy(&word, at, wordBytes);
     return word;
 }

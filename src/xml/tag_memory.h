@@ -53,6 +53,7 @@ public:
     TagMemory() = default;
     TagMemory(const TagMemory&) = delete;
     TagMemory& operator=(const TagMemory&) = delete;
+    ~TagMemory() = default;
 
     /// The tag that the text begins with, or null when it was not seen before.
     [[nodiscard]] const Tag* recall(std::string_view text, const Names& names) noexcept {

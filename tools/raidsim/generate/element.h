@@ -15,8 +15,8 @@ public:
     Element(const Element&) = default;
     Element& operator=(const Element&) = default;
     // A tree can be swapped, but not moved.
-    Element(Element&& other) { tree.swap(other.tree); }
-    Element& operator=(Element&& other) {
+    Element(Element&& other) noexcept { tree.swap(other.tree); }
+    Element& operator=(Element&& other) noexcept {
         tree.swap(other.tree);
         return *this;
     }
