@@ -43,6 +43,7 @@ MUTATED = [
     "src/model/system_and_adapter_vocabulary.h",
     "src/xml/bytes.h",
     "src/xml/element_reader.h",
+    "src/xml/name_index.h",
     "src/xml/parse_def_unit.cpp",
     "src/xml/raid_xml_error.cpp",
     "src/xml/reading_errors.cpp",
