@@ -13,7 +13,7 @@ namespace raidsim {
 namespace {
 
 using Words = std::vector<std::string>;
-using Kind = FaultStep::Kind;
+using StepKind = FaultStep::Kind;
 
 [[noreturn]] void refuse(const std::string& word, const std::string& wanted) {
     throw FaultError("\"" + word + "\" is not " + wanted);
@@ -52,10 +52,10 @@ constexpr std::array<std::pair<std::string_view, RequestKind>, 5> requests{{
     {"newest", RequestKind::newest},
     {"any", RequestKind::any},
 }};
-constexpr std::array<std::pair<std::string_view, Kind>, 3> endings{{
-    {"close", Kind::close},
-    {"reset", Kind::reset},
-    {"stall", Kind::stall},
+constexpr std::array<std::pair<std::string_view, StepKind>, 3> endings{{
+    {"close", StepKind::close},
+    {"reset", StepKind::reset},
+    {"stall", StepKind::stall},
 }};
 constexpr std::array<std::pair<std::string_view, HostCall>, 3> calls{{
     {"refresh", HostCall::refresh},
@@ -214,9 +214,9 @@ void change(CaseBuilder& builder, const Words& words) {
 void read(CaseBuilder& builder, const Words& words) {
     builder.reads = true;
     if (words[1] == "request") {
-        addStep(builder, {Kind::readRequest});
+        addStep(builder, {StepKind::readRequest});
     } else if (words[1] != "nothing") {
-        addStep(builder, {Kind::read, sizeOf(words[1])});
+        addStep(builder, {StepKind::read, sizeOf(words[1])});
     }
 }
 
@@ -227,20 +227,20 @@ void send(CaseBuilder& builder, const Words& words) {
     const std::size_t bytes = words[1] == "header"                       ? FaultStep::header
                               : words[1] == "rest" || words[1] == "body" ? FaultStep::rest
                                                                          : sizeOf(words[1]);
-    addStep(builder, {Kind::send, bytes});
+    addStep(builder, {StepKind::send, bytes});
 }
 
 void pieces(CaseBuilder& builder, const Words& words) {
-    addStep(builder, {Kind::pieces, sizeOf(words[1])});
+    addStep(builder, {StepKind::pieces, sizeOf(words[1])});
 }
 
-void taken(CaseBuilder& builder, const Words&) { addStep(builder, {Kind::taken}); }
+void taken(CaseBuilder& builder, const Words&) { addStep(builder, {StepKind::taken}); }
 
 void pause(CaseBuilder& builder, const Words& words) {
     const auto time = parseSeconds(words[1]);
     if (!time)
         refuse(words[1], "a time in seconds");
-    addStep(builder, {Kind::pause, 0, *time});
+    addStep(builder, {StepKind::pause, 0, *time});
 }
 
 void end(CaseBuilder& builder, const Words& words) {
@@ -289,11 +289,11 @@ constexpr std::array<Instruction, 13> instructions{{
 FaultCase CaseBuilder::finish() {
     auto& steps = built.steps;
     if (!reads)
-        steps.insert(steps.begin(), {Kind::readRequest});
+        steps.insert(steps.begin(), {StepKind::readRequest});
     if (!sends)
-        steps.insert(ends ? steps.end() - 1 : steps.end(), {Kind::send, FaultStep::rest});
+        steps.insert(ends ? steps.end() - 1 : steps.end(), {StepKind::send, FaultStep::rest});
     if (!ends)
-        steps.push_back({Kind::close});
+        steps.push_back({StepKind::close});
     return std::move(built);
 }
 

@@ -16,10 +16,6 @@ const DriveModel quillon140{"QUILLON", "QS15K147", "B41A", "32P0731", Interface:
 const DriveModel tessmark250{"TESSMARK", "TM7200-250", "3.AE", "39M4507", Interface::sata, 238418};
 const DriveModel ostrel300{"OSTREL", "OX10-300", "S60G", "42D0520", Interface::sas, 286102};
 
-constexpr int wideScsi = 320;
-constexpr int serialAta = 150;
-constexpr int serialScsi = 300;
-
 // Drives with consecutive device numbers from 0, all of one model.
 std::vector<DrivePlan> drives(int count, const DriveModel& model) {
     std::vector<DrivePlan> made;

@@ -37,6 +37,11 @@ struct EnclosurePlan {
     std::vector<int> slots{};
 };
 
+// What the links of the time carry, in megabytes per second.
+constexpr int wideScsi = 320;
+constexpr int serialAta = 150;
+constexpr int serialScsi = 300;
+
 struct ChannelPlan {
     int id = 0;
     Interface interface = Interface::parallelScsi;

@@ -8,7 +8,6 @@ namespace raidsim::generate {
 
 namespace {
 
-constexpr int serialScsi = 300;
 constexpr int shelfSlots = 12;
 
 DriveModel shelfDrive() {

@@ -18,7 +18,7 @@ namespace {
 
 using boost::asio::ip::tcp;
 using boost::system::error_code;
-using Kind = FaultStep::Kind;
+using StepKind = FaultStep::Kind;
 
 constexpr std::chrono::microseconds glance{100};  // between two looks at what has no event
 
@@ -67,37 +67,37 @@ void FaultSession::next() {
 
 void FaultSession::perform(const FaultStep& now) {
     switch (now.kind) {
-        case Kind::readRequest:
+        case StepKind::readRequest:
             readRequest();
             break;
-        case Kind::read:
+        case StepKind::read:
             readUpTo(now.bytes);
             break;
-        case Kind::send:
+        case StepKind::send:
             if (now.bytes == FaultStep::rest) {
                 sendUpTo(answer.bytes.size());
             } else {
                 sendUpTo(now.bytes == FaultStep::header ? answer.headerSize : sent + now.bytes);
             }
             break;
-        case Kind::pieces:
+        case StepKind::pieces:
             pieceBytes = now.bytes;
             next();
             break;
-        case Kind::taken:
+        case StepKind::taken:
             whenTaken(&FaultSession::next);
             break;
-        case Kind::pause:
+        case StepKind::pause:
             timer.expires_after(now.time);
             timer.async_wait([self = shared_from_this()](error_code) { self->next(); });
             break;
-        case Kind::close:
+        case StepKind::close:
             shutDown();
             break;
-        case Kind::reset:
+        case StepKind::reset:
             whenTaken(&FaultSession::reset);
             break;
-        case Kind::stall:
+        case StepKind::stall:
             desk.tell("fault: stalled");
             stall();
             break;

@@ -19,23 +19,23 @@ struct Field {
 };
 
 constexpr const char* number = "xsd:int";
-constexpr const char* text = "xsd:string";
+constexpr const char* string = "xsd:string";
 
 // In the order in which they are written.
 constexpr std::array<Field, 13> vocabulary{{
     {"sequenceNumber", number},
-    {"date", text},
-    {"type", text},
+    {"date", string},
+    {"type", string},
     {"eventCode", number},
-    {"string", text},
-    {"serverName", text},
-    {"serverAddress", text},
+    {"string", string},
+    {"serverName", string},
+    {"serverAddress", string},
     {"adapter", number},
     {"channel", number},
     {"deviceID", number},
     {"enclosureID", number},
     {"logicalDrive", number},
-    {"fru", text},
+    {"fru", string},
 }};
 
 std::optional<std::string> valueOf(const EventLog::Fields& fields, std::string_view name) {
