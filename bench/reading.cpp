@@ -1,21 +1,20 @@
 // From the bytes of an answer to the published lists, against readers built on XML libraries.
 //
 //   bench_reading DOCUMENTS [arguments of the harness]
+//
+// names the folder of the documents that scripts/bench has made.
 
-#include <malloc.h>
-
-#include <climits>
-#include <iostream>
-#include <map>
+#include <array>
+#include <memory>
 
 #include "RAIDInstrumentation.h"
 #include "agent/agent_link.h"
 #include "agent/envelope.h"
 #include "checksum.h"
 #include "documents.h"
-#include "flat/lists.h"
 #include "flat/snapshot.h"
 #include "harness/harness.h"
+#include "published.h"
 #include "readers/reader.h"
 
 namespace {
@@ -23,181 +22,137 @@ namespace {
 using namespace raid;
 using namespace raid::bench;
 
-auto lists() {
-    return std::tie(PellionAdapterList, LSIAdapterList, VantryAdapterList, ChannelList,
-                    RAIDArrayList, SpannedRAIDArrayList, RAIDLogicalDriveList, RAIDDiskDriveList,
-                    RAIDEnclosureDeviceList, RAIDFanList, RAIDPowerSupplyList, RAIDTempSensorList);
-}
+struct Text {
+    std::string name;
+    std::shared_ptr<const std::string> bytes;
+};
 
-template <class... Lists>
-std::tuple<Lists...> copyOf(const std::tuple<Lists&...>& originals) {
-    return std::tuple<Lists...>(originals);
+using Benchmarks = std::vector<Benchmark>;
+
+void read(const Reader& reader, const Text& text) {
+    reader.read(copyOf(*text.bytes), static_cast<int>(text.bytes->size()));
 }
 
 /// Over the model and everything that is published of it.
-std::uint64_t checksumOf(const Reader& reader, const std::string& document) {
-    reader.read(bench::copyOf(document), static_cast<int>(document.size()));
+std::uint64_t checksumOf(const Reader& reader, const Text& text) {
+    read(reader, text);
     flat::publish(*reader.model());
     Checksum sum;
     sum.add(*reader.model());
-    std::apply([&](const auto&... list) { (sum.addAll(list), ...); }, lists());
+    std::apply([&](const auto&... list) { (sum.addAll(list), ...); }, publishedLists());
     return sum.value();
 }
 
-void requireSameOutcome(const std::string& name, const std::string& document) {
-    const auto expected = checksumOf(readers().front(), document);
+void requireSameOutcome(const Text& text) {
+    const auto expected = checksumOf(readers().front(), text);
     for (const auto& reader : readers()) {
-        if (checksumOf(reader, document) != expected) {
-            throw std::runtime_error(name + ": " + std::string(reader.name) +
+        if (checksumOf(reader, text) != expected) {
+            throw std::runtime_error(text.name + ": " + std::string(reader.name) +
                                      " reads another model than the library");
         }
     }
 }
 
 /// The copy of the document that is read is made before the time begins.
-std::chrono::nanoseconds timeOfReading(const Reader& reader, const std::string& document,
-                                       bool publishes) {
-    auto copy = bench::copyOf(document);
+std::chrono::nanoseconds timeOfReading(const Reader& reader, const Text& text, bool publishes) {
+    auto copy = copyOf(*text.bytes);
     return processorTime([&] {
-        reader.read(std::move(copy), static_cast<int>(document.size()));
+        reader.read(std::move(copy), static_cast<int>(text.bytes->size()));
         if (publishes) {
             flat::publish(*reader.model());
         }
     });
 }
 
-class Suite {
-public:
-    explicit Suite(std::filesystem::path folder) : documents(std::move(folder)) {}
+template <class Run>
+void add(Benchmarks& to, std::string name, const Text& text, Run run) {
+    to.push_back({std::move(name), static_cast<double>(text.bytes->size()), std::move(run)});
+}
 
-    /// Whatever sizes and shapes scripts/bench has made.
-    void addEverythingThere() {
-        for (const auto& file : std::filesystem::directory_iterator(documents)) {
-            const auto name = file.path().stem().string();
-            if (name.starts_with("events-")) {
-                addEvents(name);
-            } else {
-                addReaders(name);
-                if (name.ends_with("-compact")) {
-                    addPublishing(name);
-                }
+void addReaders(Benchmarks& to, const Text& text) {
+    requireSameOutcome(text);
+    for (const auto& reader : readers()) {
+        for (const bool publishes : {false, true}) {
+            add(to, (publishes ? "publish/" : "read/") + text.name + "/" + std::string(reader.name),
+                text,
+                [&reader, text, publishes] { return timeOfReading(reader, text, publishes); });
+        }
+    }
+}
+
+template <class... Lists>
+std::tuple<Lists...> valuesOf(const std::tuple<Lists&...>& originals) {
+    return std::tuple<Lists...>(originals);
+}
+
+/// What is published against a plain copy of it that is dropped again; both make and destroy every
+/// record once.
+void addPublishing(Benchmarks& to, const Text& text) {
+    const auto afterReading = [text](auto work) {
+        const auto& reader = readers().front();
+        read(reader, text);
+        flat::publish(*reader.model());
+        return processorTime(work);
+    };
+    add(to, "lists/" + text.name + "/publish", text,
+        [afterReading] { return afterReading([] { flat::publish(*readers().front().model()); }); });
+    add(to, "lists/" + text.name + "/copy", text,
+        [afterReading] { return afterReading([] { use(valuesOf(publishedLists())); }); });
+}
+
+void addEvents(Benchmarks& to, const Text& text) {
+    add(to, "read/" + text.name + "/library", text, [text] {
+        auto copy = copyOf(*text.bytes);
+        return processorTime(
+            [&] { processEventXML(copy.release(), static_cast<int>(text.bytes->size())); });
+    });
+}
+
+void addLogLevels(Benchmarks& to, const Text& text) {
+    for (const int level : {0, 1, 8}) {
+        add(to, "log/" + text.name + "/level " + std::to_string(level), text, [text, level] {
+            LOG_LEVEL = level;
+            const auto time = timeOfReading(readers().front(), text, true);
+            LOG_LEVEL = 0;
+            return time;
+        });
+    }
+    constexpr int calls = 1000;
+    to.push_back({"log/" + std::to_string(calls) + " calls below the level", calls, [] {
+                      return processorTime([] {
+                          for (int i = 0; i < calls; ++i) {
+                              debug(9, "not written\n");
+                          }
+                      });
+                  }});
+}
+
+/// Of the sizes and shapes, what the folder has; a quick run makes fewer.
+Benchmarks benchmarksFor(const std::string& folder) {
+    configRead = 1;
+    const auto file = [&folder](const std::string& name) {
+        return std::filesystem::path(folder) / (name + ".xml");
+    };
+    const auto text = [&file](const std::string& name) {
+        return Text{name, std::make_shared<const std::string>(load(file(name)))};
+    };
+    Benchmarks made;
+    for (const std::string size : {"small", "1MB", "20MB", "100MB"}) {
+        for (const auto* const shape : {"-compact", "-indented", "-shuffled"}) {
+            if (exists(file(size + shape))) {
+                addReaders(made, text(size + shape));
             }
         }
-    }
-
-    void addReaders(const std::string& name) {
-        const auto& document = loaded(name);
-        requireSameOutcome(name, document);
-        for (const auto& reader : readers()) {
-            for (const bool publishes : {false, true}) {
-                add((publishes ? "publish/" : "read/") + name + "/" + std::string(reader.name),
-                    document, [&reader, &document, publishes] {
-                        return timeOfReading(reader, document, publishes);
-                    });
-            }
+        if (exists(file(size + "-compact"))) {
+            addPublishing(made, text(size + "-compact"));
         }
     }
-
-    /// What is published against a plain copy of it that is dropped again; both make and destroy
-    /// every record once.
-    void addPublishing(const std::string& name) {
-        const auto& document = loaded(name);
-        const auto prepare = [&document] {
-            const auto& reader = readers().front();
-            reader.read(bench::copyOf(document), static_cast<int>(document.size()));
-            flat::publish(*reader.model());
-        };
-        add("lists/" + name + "/publish", document, [prepare] {
-            prepare();
-            return processorTime([] { flat::publish(*readers().front().model()); });
-        });
-        add("lists/" + name + "/copy", document, [prepare] {
-            prepare();
-            return processorTime([] { use(copyOf(lists())); });
-        });
-    }
-
-    void addEvents(const std::string& name) {
-        const auto& document = loaded(name);
-        add("read/" + name + "/library", document, [&document] {
-            auto copy = bench::copyOf(document);
-            return processorTime(
-                [&] { processEventXML(copy.release(), static_cast<int>(document.size())); });
-        });
-    }
-
-    void addLogLevels(const std::string& name) {
-        const auto& document = loaded(name);
-        for (const int level : {0, 1, 8}) {
-            add("log/" + name + "/level " + std::to_string(level), document, [&document, level] {
-                LOG_LEVEL = level;
-                const auto time = timeOfReading(readers().front(), document, true);
-                LOG_LEVEL = 0;
-                return time;
-            });
-        }
-        constexpr int calls = 1000;
-        benchmarks.push_back({"log/a call below its level", calls, [] {
-                                  return processorTime([] {
-                                      for (int i = 0; i < calls; ++i) {
-                                          debug(9, "not written\n");
-                                      }
-                                  });
-                              }});
-    }
-
-    int run(int argc, char** argv) { return measure(std::move(benchmarks), argc, argv); }
-
-private:
-    const std::string& loaded(const std::string& name) {
-        auto& document = texts[name];
-        if (document.empty()) {
-            document = load(documents / (name + ".xml"));
-        }
-        return document;
-    }
-
-    void add(std::string name, const std::string& document,
-             std::function<std::chrono::nanoseconds()> run) {
-        benchmarks.push_back({std::move(name), static_cast<double>(document.size()),
-                              [run = std::move(run)] { return run(); }});
-    }
-
-    std::filesystem::path documents;
-    std::map<std::string, std::string> texts;
-    std::vector<Benchmark> benchmarks;
-};
+    addEvents(made, text("events-100"));
+    addEvents(made, text("events-10000"));
+    addLogLevels(made, text("small-compact"));
+    return made;
+}
 
 }  // namespace
 
-int main(int argc, char** argv) {
-    if (argc < 2) {
-        std::cerr << "usage: bench_reading DOCUMENTS [arguments of the harness]\n";
-        return 64;
-    }
-    // As in a host that has run for a while: memory that was freed stays with the process.
-    mallopt(M_MMAP_THRESHOLD, INT_MAX);
-    mallopt(M_TRIM_THRESHOLD, INT_MAX);
-    configRead = 1;
-    try {
-        Suite suite(argv[1]);
-        argv[1] = argv[0];
-        const std::vector<std::string> sizes =
-            std::getenv("RAID_BENCH_SIZES") == nullptr
-                ? std::vector<std::string>{"small", "1MB"}
-                : std::vector<std::string>{"small", "1MB", "20MB"};
-        for (const auto& size : sizes) {
-            for (const auto* const shape : {"compact", "indented", "shuffled"}) {
-                suite.addReaders(size + "-" + shape);
-            }
-            suite.addPublishing(size + "-compact");
-        }
-        suite.addEvents("events-100");
-        suite.addEvents("events-10000");
-        suite.addLogLevels("small-compact");
-        return suite.run(argc - 1, argv + 1);
-    } catch (const std::exception& error) {
-        std::cerr << "bench_reading: " << error.what() << '\n';
-        return 70;
-    }
-}
+int main(int argc, char** argv) { return measureAll(&benchmarksFor, argc, argv); }

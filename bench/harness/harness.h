@@ -20,6 +20,11 @@ struct Benchmark {
 /// Measures all and writes JSON to the file that the arguments name (see scripts/bench).
 int measure(std::vector<Benchmark> benchmarks, int argc, char** argv);
 
+/// What main() of a benchmark does: `benchmarksFor` gets the first argument, the harness the
+/// others.
+int measureAll(std::vector<Benchmark> (*benchmarksFor)(const std::string& argument), int argc,
+               char** argv);
+
 /// The time that something takes on this thread's processor.
 template <class Work>
 std::chrono::nanoseconds processorTime(Work work) {

@@ -1,6 +1,6 @@
 // The same as google.cpp, for a width in which Google Benchmark is not packaged. It takes the
 // arguments that scripts/bench gives: how often each benchmark is repeated, for how long at least,
-// and where the results go.
+// and where the results go; and --benchmark_filter.
 
 #include <algorithm>
 #include <fstream>
@@ -8,6 +8,7 @@
 #include <map>
 #include <nlohmann/json.hpp>
 #include <random>
+#include <regex>
 #include <string_view>
 
 #include "harness/harness.h"
@@ -42,6 +43,12 @@ int measure(std::vector<Benchmark> benchmarks, int argc, char** argv) {
     const auto options = optionsOf(argc, argv);
     const int repetitions = std::stoi(options.at("--benchmark_repetitions"));
     const std::chrono::duration<double> atLeast(std::stod(options.at("--benchmark_min_time")));
+    if (const auto filter = options.find("--benchmark_filter"); filter != options.end()) {
+        const std::regex wanted(filter->second);
+        std::erase_if(benchmarks, [&wanted](const Benchmark& each) {
+            return !std::regex_search(each.name, wanted);
+        });
+    }
     std::mt19937 random(1);
     nlohmann::json results = nlohmann::json::array();
     for (int repetition = 0; repetition < repetitions; ++repetition) {

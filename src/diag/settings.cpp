@@ -1,4 +1,5 @@
 #include "base/decimal.h"
+#include "base/shared_value.h"
 #include "diag/log.h"
 #include "orvo/property_file.h"
 

@@ -7,8 +7,8 @@
 
 #include "base/decimal.h"
 #include "diag/log.h"
-#include "xml/name_index.h"
 #include "xml/raid_xml_error.h"
+#include "xml/usual_tags.h"
 #include "xml/vocabulary.h"
 
 namespace raid::xml {
@@ -17,8 +17,8 @@ namespace raid::xml {
 [[noreturn]] void throwUnknown(const Unit& found);
 [[noreturn]] void throwNestedTooDeep(const Unit& found);
 
-inline void traceLine(const char* line) {
-    if (diag::passes(diag::readingLevel)) {
+inline void traceLine(const UnitReader& units, const char* line) {
+    if (units.isTraced()) {
         debug(diag::readingLevel, line);
     }
 }
@@ -40,33 +40,20 @@ private:
     UnitReader& units;
 };
 
-// What a name is to a class that is not one of its children.
-inline constexpr int ownName = -1;
-inline constexpr int unknownName = -2;
-
-/// The names of the children, and the element's own behind them.
-template <class Model>
-inline constexpr auto indexOf = [] {
-    constexpr auto& children = childrenOf<Model>;
-    std::array<std::string_view, children.size() + 1> names;
-    std::ranges::transform(children, names.begin(), [](const auto& child) { return child.name; });
-    names.back() = Vocabulary<Model>::words.element;
-    return NameIndex(names);
-}();
-
 /// The row of the child, or what else the name is to the class.
 template <class Model>
 int numberOf(std::string_view name) {
-    constexpr auto count = childrenOf<Model>.size();
-    const auto place = indexOf<Model>.find(name);
-    if (place < count) {
-        return static_cast<int>(place);
+    constexpr auto& children = childrenOf<Model>;
+    const auto child = std::ranges::find(children, name, &Child<Model>::name);
+    if (child != children.end()) {
+        return static_cast<int>(child - children.begin());
     }
-    return place == count ? ownName : unknownName;
+    return name == Vocabulary<Model>::words.element ? ownName : unknownName;
 }
 
 template <class Model>
-inline constexpr Names namesOf{&numberOf<Model>, seedOf(Vocabulary<Model>::words.element)};
+inline constexpr Names namesOf{&numberOf<Model>, UsualTags<Model>::known,
+                               TagIndex(UsualTags<Model>::beginnings)};
 
 template <class Model>
 void keepText(Model& model, const Child<Model>& child, std::string_view text) {
@@ -85,18 +72,9 @@ void keepText(Model& model, const Child<Model>& child, std::string_view text) {
     }
 }
 
-/// An element without text, written either way, leaves the member as it was.
+/// The rest of a simple element in any form. Rare, and so kept out of the loop around it.
 template <class Model>
-void readSimple(Model& model, const Child<Model>& child, UnitReader& units, const Unit& start) {
-    if (start.closing) {
-        return;
-    }
-    if (const auto plain = units.plainText(child.name)) {
-        if (!plain->empty()) {
-            keepText(model, child, *plain);
-        }
-        return;
-    }
+[[gnu::noinline]] void readAnyText(Model& model, const Child<Model>& child, UnitReader& units) {
     auto unit = units.next();
     if (!unit.isTag && unit.finished) {
         keepText(model, child, unit.name);
@@ -105,6 +83,21 @@ void readSimple(Model& model, const Child<Model>& child, UnitReader& units, cons
     const bool ends = unit.isTag && unit.finished && unit.closing && unit.name == child.name;
     if (!ends) {
         throwMissingEnd(child.endWord, unit);
+    }
+}
+
+/// An element without text, written either way, leaves the member as it was.
+template <class Model>
+void readSimple(Model& model, std::size_t number, UnitReader& units, const Unit& start) {
+    if (start.closing) {
+        return;
+    }
+    const auto& child = childrenOf<Model>[number];
+    const auto plain = units.plainText(UsualTags<Model>::endTagOf(number));
+    if (!plain) {
+        readAnyText(model, child, units);
+    } else if (!plain->empty()) {
+        keepText(model, child, *plain);
     }
 }
 
@@ -154,18 +147,19 @@ void requireEnd(const NamedUnit& found) {
 
 template <class Model>
 void readChildren(Model& model, UnitReader& units) {
-    while (!units.passEnd(Vocabulary<Model>::words.element)) {
-        const auto& found = units.next(namesOf<Model>);
-        const auto& [unit, number] = found;
-        if (number < 0 || !unit.opening || !unit.finished) {
+    auto& children = units.childrenOf(namesOf<Model>);
+    for (;;) {
+        const auto& found = units.next(children);
+        const auto& unit = found.unit;
+        if (found.number < 0 || !unit.opening || !unit.finished) {
             requireEnd<Model>(found);
             return;
         }
-        const auto& child = childrenOf<Model>[static_cast<std::size_t>(number)];
-        if (child.read != nullptr) {
-            child.read(model, units, unit);
+        const auto number = static_cast<std::size_t>(found.number);
+        if (const auto read = childrenOf<Model>[number].read) {
+            read(model, units, unit);
         } else {
-            readSimple(model, child, units, unit);
+            readSimple(model, number, units, unit);
         }
     }
 }
@@ -196,22 +190,22 @@ void readContent(Model& model, UnitReader& units, const Unit& start) {
 /// The frame around every element: its lines in the trace, and its line in the message of an
 /// error inside it.
 template <class Model, class Read>
-void tracedReading(Model& model, Read read) {
+void tracedReading(Model& model, const UnitReader& units, Read read) {
     constexpr auto& words = Vocabulary<Model>::words;
-    traceLine(words.entry);
+    traceLine(units, words.entry);
     try {
         read();
     } catch (RAIDXMLError& error) {
         processException(words.context,
                          words.detail == nullptr ? std::string() : model.*words.detail, error);
     }
-    traceLine(words.exit);
+    traceLine(units, words.exit);
 }
 
 /// What the parent has looked at to choose this reader, the reader reads for itself.
 template <class Model>
 void readElement(Model& model, UnitReader& units, const Unit& start) {
-    tracedReading(model, [&] { readContent(model, units, units.again(start)); });
+    tracedReading(model, units, [&] { readContent(model, units, units.again(start)); });
 }
 
 /// What a public reading constructor does: reads the element that the text begins with and reports
@@ -219,7 +213,7 @@ void readElement(Model& model, UnitReader& units, const Unit& start) {
 template <class Model>
 void readElement(Model& model, const char* text, int length, int* consumed) {
     UnitReader units(text, length);
-    tracedReading(model, [&] { readContent(model, units, units.next()); });
+    tracedReading(model, units, [&] { readContent(model, units, units.next()); });
     if (consumed != nullptr) {
         *consumed = units.consumed();
     }

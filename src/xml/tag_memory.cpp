@@ -2,49 +2,40 @@
 
 #include <algorithm>
 
+#include "xml/bytes.h"
+
 namespace raid::xml {
 
-std::size_t TagMemory::bucketOf(std::string_view tag, const Names& names) noexcept {
-    constexpr std::uint64_t spread = 0x9E3779B97F4A7C15;  // 2^64 divided by the golden ratio
-    std::uint64_t mixed = names.seed;
-    for (const auto offset : tellingWords) {
-        std::uint64_t word = 0;
-        std::memcpy(&word, tag.data() + offset, sizeof word);
-        mixed = (mixed ^ word) * spread;
+TagMemory::TagMemory(const Names& known, std::pmr::memory_resource* room)
+    : names(known), tags(known.usual.size(), room), last(&tags.back()) {
+    for (std::size_t place = 0; place < tags.size(); ++place) {
+        static_cast<KnownTag&>(tags[place]) = known.usual[place];
+        tags[place].follower = &tags[(place + 1) % tags.size()];
     }
-    return static_cast<std::size_t>(mixed >> 0x38U);  // one of 256
 }
 
-const TagMemory::Tag* TagMemory::search(std::string_view text, const Names& names) noexcept {
-    if (text.size() < shortest) {
+TagMemory::Tag& TagMemory::follow(Tag& tag) noexcept {
+    last->follower = &tag;
+    last = &tag;
+    return tag;
+}
+
+const KnownTag* TagMemory::search(std::string_view text) noexcept {
+    if (text.size() < names.index.reach() || text[0] != '<') {
         return nullptr;
     }
-    searched = &buckets[bucketOf(text, names)];
-    for (const auto number : *searched) {
-        if (number == 0) {
-            break;
-        }
-        if (auto& tag = tags[number - 1U]; tag.opens(text, names)) {
-            return &follow(tag);
-        }
-    }
-    return nullptr;
+    auto& tag = text[1] == '/' ? tags.back() : tags[names.index.candidate(text.data())];
+    return tag.opens(text) ? &follow(tag) : nullptr;
 }
 
-void TagMemory::keep(std::string_view bytes, const Names& names, const NamedUnit& found) {
-    if (bytes.size() < shortest || tags.size() == mostTags) {
-        return;
-    }
-    const auto free = std::ranges::find(*searched, 0);
-    if (free == searched->end()) {
-        return;
-    }
-    if (tags.empty()) {
-        tags.reserve(mostTags);
-    }
-    auto& tag = tags.emplace_back(Tag{bytes, found, &names, nullptr});
-    *free = static_cast<std::uint8_t>(tags.size());
-    follow(tag);
+void TagMemory::keep(std::string_view bytes, const NamedUnit& found) noexcept {
+    static_cast<KnownTag&>(follow(tags[static_cast<std::size_t>(found.number)])) = {bytes, found};
+}
+
+TagMemory& TagMemories::of(const Names& names) {
+    const auto known =
+        std::ranges::find_if(memories, [&](const TagMemory& memory) { return memory.isOf(names); });
+    return known != memories.end() ? *known : memories.emplace_front(names, &room);
 }
 
 }  // namespace raid::xml

@@ -1,107 +1,109 @@
 #pragma once
 
-#include <array>
 #include <cstddef>
-#include <cstdint>
 #include <cstring>
+#include <forward_list>
+#include <memory_resource>
+#include <span>
 #include <string_view>
 #include <vector>
 
+#include "xml/tag_index.h"
 #include "xml/unit.h"
 
 namespace raid::xml {
 
-/// How a class numbers the names that it knows.
-struct Names {
-    int (*numberOf)(std::string_view name) = nullptr;
-    std::uint64_t seed = 0;  // another one for each class, so that their tags lie apart
-};
+// What a name is to a class that is not one of its children.
+inline constexpr int ownName = -1;
+inline constexpr int unknownName = -2;
 
-/// The seed of the class with that element.
-constexpr std::uint64_t seedOf(std::string_view element) noexcept {
-    std::uint64_t seed = 0;
-    for (const char c : element) {
-        seed = seed * 0x83U + static_cast<unsigned char>(c);
-    }
-    return seed;
-}
-
-/// A unit, and the number that its name has for the class that is being read.
+/// A unit, and what its name is to the class that is being read: the number of a child, or else.
 struct NamedUnit {
     Unit unit;
-    int number = 0;
+    int number = unknownName;
 };
 
-/// The tags of a document that were read so far. The service repeats a few hundred tags over and
-/// over, byte for byte and mostly in the same order, and the same bytes are always the same unit:
-/// so most tags need no reading, only a comparison with the tag that followed the last time. The
-/// text must outlive the memory, and what recall returns lives as long as the memory.
+/// A tag, known by its bytes from "<" to ">"; without bytes it is not known yet.
+struct KnownTag {
+    std::string_view bytes;
+    NamedUnit found;
+
+    [[nodiscard]] bool opens(std::string_view text) const noexcept {
+        // Without bytes this is the largest number there is.
+        return bytes.size() - 1U < text.size() &&
+               std::memcmp(bytes.data(), text.data(), bytes.size()) == 0;
+    }
+};
+
+/// What a class knows of the tags inside its element.
+struct Names {
+    int (*numberOf)(std::string_view name) = nullptr;
+    /// The start tags of the children by number, as far as it is known how the service writes
+    /// them, and behind them the end tag of the element.
+    std::span<const KnownTag> usual;
+    TagIndex index;  // of the start tags
+};
+
+/// The tags inside the elements of one class, as the document wrote each of them last, and in what
+/// order they came. The service repeats the same tags over and over, byte for byte and mostly in
+/// the same order, and the same bytes are always the same unit: so most tags need no reading, only
+/// a comparison with the tag that followed the last time.
 class TagMemory {
 public:
-    struct Tag {
-        std::string_view bytes;  // from "<" to ">"
-        NamedUnit found;
-        const Names* names = nullptr;
-        Tag* follower = nullptr;  // the tag that came after this one the last time
-
-        [[nodiscard]] bool opens(std::string_view text, const Names& asked) const noexcept {
-            return bytes.size() <= text.size() && names == &asked &&
-                   std::memcmp(bytes.data(), text.data(), bytes.size()) == 0;
-        }
-    };
-
-    TagMemory() = default;
+    /// The children are expected in the order of their numbers until it is seen otherwise.
+    TagMemory(const Names& known, std::pmr::memory_resource* room);
     TagMemory(const TagMemory&) = delete;
     TagMemory& operator=(const TagMemory&) = delete;
     ~TagMemory() = default;
 
-    /// The tag that the text begins with, or null when it was not seen before.
-    [[nodiscard]] const Tag* recall(std::string_view text, const Names& names) noexcept {
-        if (expected != nullptr && expected->opens(text, names)) [[likely]] {
-            return &pass(*expected);
+    /// The tag that the text begins with, or null when it has to be read. The text must outlive
+    /// the memory; the tag is good until the next call.
+    [[nodiscard]] const KnownTag* recall(std::string_view text) noexcept {
+        if (auto* const guess = last->follower; guess->opens(text)) [[likely]] {
+            last = guess;
+            return guess;
         }
-        return search(text, names);
+        return search(text);
     }
 
-    /// Remembers the tag at the front of the text that recall did not know last, if there is room.
-    /// Tags without attributes are too short to be told apart by their beginning; they are not
-    /// kept.
-    void keep(std::string_view bytes, const Names& names, const NamedUnit& found);
+    [[nodiscard]] int numberOf(std::string_view name) const { return names.numberOf(name); }
+
+    /// Remembers how the child with the number of the found unit is written.
+    void keep(std::string_view bytes, const NamedUnit& found) noexcept;
+
+    [[nodiscard]] bool isOf(const Names& known) const noexcept { return &names == &known; }
 
 private:
-    // An inventory has some 180 tags of different bytes or classes.
-    static constexpr std::size_t mostTags = 255;
+    struct Tag : KnownTag {
+        Tag* follower = nullptr;  // the one that came after it the last time
+    };
 
-    // Where tags begin to differ, and where those with the longest common beginning do.
-    static constexpr std::array<std::size_t, 3> tellingWords{4, 12, 16};
-    static constexpr std::size_t shortest = tellingWords.back() + sizeof(std::uint64_t);
-
-    /// The numbers of up to four tags, from 1; 0 stands for none.
-    using Bucket = std::array<std::uint8_t, 4>;
-
-    [[nodiscard]] static std::size_t bucketOf(std::string_view tag, const Names& names) noexcept;
-
-    [[nodiscard]] const Tag* search(std::string_view text, const Names& names) noexcept;
-
-    const Tag& pass(Tag& tag) noexcept {
-        last = &tag;
-        expected = tag.follower;
-        return tag;
-    }
+    [[nodiscard]] const KnownTag* search(std::string_view text) noexcept;
 
     /// Notes that the tag came after the one before it.
-    const Tag& follow(Tag& tag) noexcept {
-        if (last != nullptr) {
-            last->follower = &tag;
-        }
-        return pass(tag);
-    }
+    Tag& follow(Tag& tag) noexcept;
 
-    std::array<Bucket, 256> buckets{};
-    Bucket* searched = nullptr;  // where the tag that recall did not know belongs
-    std::vector<Tag> tags;       // never moved: all the room is reserved at once
-    Tag* last = nullptr;
-    Tag* expected = nullptr;
+    const Names& names;
+    std::pmr::vector<Tag> tags;  // in the order of names.usual; never moved
+    Tag* last;                   // the end of an element is before the beginning of the next
+};
+
+/// The tags of all classes of a document.
+class TagMemories {
+public:
+    TagMemories() = default;
+    TagMemories(const TagMemories&) = delete;
+    TagMemories& operator=(const TagMemories&) = delete;
+    ~TagMemories() = default;
+
+    TagMemory& of(const Names& names);
+
+private:
+    // Enough for the vocabulary of the configuration, so that it costs one allocation.
+    static constexpr std::size_t usualSize = 16 * 1024;
+
+    std::pmr::monotonic_buffer_resource room{usualSize};
+    std::pmr::forward_list<TagMemory> memories{&room};
 };
 
 }  // namespace raid::xml

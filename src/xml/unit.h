@@ -65,8 +65,8 @@ struct Unit {
     bool opening = false;
     bool closing = false;
     bool finished = false;  // or else the document ended before the unit did
-    std::string_view name;
-    std::string_view type;  // value of the last "xsi:type" attribute
+    std::string_view name = {};
+    std::string_view type = {};  // value of the last "xsi:type" attribute
 };
 
 /// Fills a Unit from a scan.

@@ -2,11 +2,11 @@
 
 namespace raid::xml {
 
-const NamedUnit& UnitReader::readNamed(const Names& names) {
+const NamedUnit& UnitReader::readNamed(TagMemory& children) {
     const auto unit = next();
-    current = {unit, names.numberOf(unit.name)};
-    if (!traced && unit.isTag && unit.finished) {
-        memory.keep({before, between(before, at)}, names, current);
+    current = {unit, children.numberOf(unit.name)};
+    if (unit.opening && unit.finished && current.number >= 0) {
+        children.keep({before, between(before, at)}, current);
     }
     return current;
 }

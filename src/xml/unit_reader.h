@@ -1,6 +1,7 @@
 #pragma once
 
 #include <algorithm>
+#include <iterator>
 #include <optional>
 #include <string_view>
 
@@ -39,43 +40,36 @@ public:
         return next();
     }
 
+    /// What the document has shown of the children of a class.
+    TagMemory& childrenOf(const Names& names) { return memories.of(names); }
+
     /// The next unit and the number of its name. The reference holds until the next call.
-    const NamedUnit& next(const Names& names) {
-        if (!traced) {
-            passSpaceBeforeTag();
-            if (const auto* const tag = memory.recall(rest(), names)) {
+    const NamedUnit& next(TagMemory& children) {
+        if (at < plainEnd) {
+            if (*at != '<') {
+                at = passSpace(at, end);
+            }
+            if (const auto* const tag = children.recall({at, between(at, end)})) {
                 at += tag->bytes.size();
                 return tag->found;
             }
         }
-        return readNamed(names);
-    }
-
-    /// Passes the end tag of the element where it comes next, in its plainest form.
-    bool passEnd(std::string_view element) noexcept {
-        if (traced) {
-            return false;
-        }
-        passSpaceBeforeTag();
-        const bool ends = isEndAt(at, element);
-        if (ends) {
-            at += endTagBytes(element);
-        }
-        return ends;
+        return readNamed(children);
     }
 
     /// The rest of a simple element, text and end tag, where it comes in its plainest form: returns
     /// the text, empty when there is only space.
-    std::optional<std::string_view> plainText(std::string_view element) noexcept {
+    std::optional<std::string_view> plainText(std::string_view endTag) noexcept {
         const char* const stop = findTag(at, end);
-        if (traced || !isEndAt(stop, element)) {
+        if (plainEnd - stop < std::ssize(endTag) || !standsAt(stop, endTag)) {
             return std::nullopt;
         }
         const auto text = trimmed({at, between(at, stop)});
-        at = stop + endTagBytes(element);
+        at = stop + endTag.size();
         return text;
     }
 
+    [[nodiscard]] bool isTraced() const noexcept { return traced; }
     [[nodiscard]] int consumed() const noexcept { return static_cast<int>(at - start); }
     [[nodiscard]] const char* position() const noexcept { return at; }
     [[nodiscard]] int remaining() const noexcept { return static_cast<int>(end - at); }
@@ -84,24 +78,7 @@ public:
     int nesting = 0;
 
 private:
-    static constexpr std::size_t endTagBytes(std::string_view element) noexcept {
-        return element.size() + std::string_view("</>").size();
-    }
-
-    [[nodiscard]] bool isEndAt(const char* tag, std::string_view element) const noexcept {
-        return between(tag, end) >= endTagBytes(element) && tag[0] == '<' && tag[1] == '/' &&
-               tag[endTagBytes(element) - 1] == '>' && standsAt(tag + 2, element);
-    }
-
-    [[nodiscard]] std::string_view rest() const noexcept { return {at, between(at, end)}; }
-
-    void passSpaceBeforeTag() noexcept {
-        if (at != end && *at != '<') {
-            at = passSpace(at, end);
-        }
-    }
-
-    const NamedUnit& readNamed(const Names& names);
+    const NamedUnit& readNamed(TagMemory& children);
 
     const char* start;
     const char* at;
@@ -109,7 +86,9 @@ private:
     const char* end;
     // Asked once, since it is of interest at every unit.
     bool traced = diag::passes(diag::readingLevel);
-    TagMemory memory;
+    // How far the plain forms are looked for: where a document is traced, nowhere.
+    const char* plainEnd = traced ? start : end;
+    TagMemories memories;
     NamedUnit current;
 };
 

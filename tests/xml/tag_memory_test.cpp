@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <string>
 #include <vector>
 
@@ -13,111 +14,126 @@ using namespace raid::xml;
 
 const std::string size = "<as:size xsi:type=\"xsd:int\">";
 const std::string name = "<as:name xsi:type=\"xsd:string\">";
+const std::string state = "<as:state xsi:type=\"xsd:int\">";
+const std::string end = "</ac:hardDrive>";
 
-int anyNumber(std::string_view /*name*/) { return 0; }
-constexpr Names drive{&anyNumber, seedOf("ac:hardDrive")};
-constexpr Names array{&anyNumber, seedOf("ac:basicArray")};
+constexpr std::array<std::string_view, 3> children{"as:size", "as:name", "as:state"};
+constexpr std::array<std::string_view, 3> beginnings{
+    "<as:size xsi:type=", "<as:name xsi:type=", "<as:state xsi:type="};
+
+int numberOf(std::string_view asked) {
+    const auto* const child = std::ranges::find(children, asked);
+    return child == children.end() ? unknownName : static_cast<int>(child - children.begin());
+}
+
+// Only the end tag is known from the beginning.
+constexpr std::array<KnownTag, 4> endTagOnly{
+    {{}, {}, {}, {"</ac:hardDrive>", {{.isTag = true, .closing = true}, ownName}}}};
+constexpr Names drive{&numberOf, endTagOnly, TagIndex(beginnings)};
+constexpr Names otherDrive = drive;
 
 class RememberedTags : public testing::Test {
 protected:
-    void keep(const std::string& tag, const Names& names, int number) {
-        ASSERT_EQ(memory.recall(tag, names), nullptr);
-        NamedUnit found;
-        found.number = number;
-        memory.keep(tag, names, found);
+    static NamedUnit numbered(int number) { return {{.isTag = true, .opening = true}, number}; }
+
+    // The number that was kept with the tag; -2 when it is not known.
+    int recall(const std::string& text) {
+        const auto* const tag = memory.recall(text);
+        return tag == nullptr ? unknownName : tag->found.number;
     }
 
-    // The number that was kept with the tag; -1 when it is not known.
-    int recall(const std::string& text, const Names& names) {
-        const auto* const tag = memory.recall(text, names);
-        return tag == nullptr ? -1 : tag->found.number;
-    }
-
-    TagMemory memory;
+    TagMemories memories;
+    TagMemory& memory = memories.of(drive);
 };
 
 TEST_F(RememberedTags, AreRecalledByTheirBytesAtTheFrontOfAText) {
-    EXPECT_EQ(recall(size + "5</as:size>", drive), -1);
-    keep(size, drive, 7);
-    EXPECT_EQ(recall(size + "5</as:size>", drive), 7);
-    EXPECT_EQ(recall(size, drive), 7);
-    EXPECT_EQ(recall(" " + size, drive), -1);
-    EXPECT_EQ(recall(name, drive), -1);
-    EXPECT_EQ(recall("", drive), -1);
+    EXPECT_EQ(recall(size + "5</as:size>"), unknownName);
+    memory.keep(size, numbered(0));
+    EXPECT_EQ(recall(size + "5</as:size>"), 0);
+    EXPECT_EQ(recall(size), 0);
+    EXPECT_EQ(recall(" " + size), unknownName);
+    EXPECT_EQ(recall(name), unknownName);
+    EXPECT_EQ(recall(""), unknownName);
 }
 
 TEST_F(RememberedTags, AreRecalledWholeOnly) {
-    keep(size, drive, 7);
+    memory.keep(size, numbered(0));
     for (std::size_t length = 0; length < size.size(); ++length) {
-        EXPECT_EQ(recall(size.substr(0, length), drive), -1) << length;
+        EXPECT_EQ(recall(size.substr(0, length)), unknownName) << length;
     }
     for (std::size_t place = 0; place < size.size(); ++place) {
         auto other = size;
         other[place] = '~';
-        EXPECT_EQ(recall(other, drive), -1) << other;
+        EXPECT_EQ(recall(other), unknownName) << other;
     }
 }
 
 TEST_F(RememberedTags, TellTheBytesThatTheyAre) {
-    keep(size, drive, 7);
+    memory.keep(size, numbered(0));
     const auto text = size + "5";
-    const auto* const tag = memory.recall(text, drive);
+    const auto* const tag = memory.recall(text);
     ASSERT_NE(tag, nullptr);
     EXPECT_EQ(tag->bytes, size);
 }
 
 TEST_F(RememberedTags, BelongToTheClassThatWasRead) {
-    keep(size, drive, 7);
-    EXPECT_EQ(recall(size, array), -1);
-    keep(size, array, 3);
-    EXPECT_EQ(recall(size, array), 3);
-    EXPECT_EQ(recall(size, drive), 7);
+    memory.keep(size, numbered(0));
+    EXPECT_EQ(memories.of(otherDrive).recall(size), nullptr);
+    EXPECT_EQ(&memories.of(drive), &memory);
+    EXPECT_EQ(recall(size), 0);
 }
 
 TEST_F(RememberedTags, AreRecalledInWhateverOrderTheyCome) {
-    const std::vector<std::string> tags{size,
-                                        name,
-                                        "<as:state xsi:type=\"xsd:int\">",
-                                        "<as:vendor xsi:type=\"xsd:string\">",
-                                        "<as:writeCacheEnable xsi:type=\"xsd:int\">",
-                                        "<as:writeCacheEnableSupported xsi:type=\"xsd:boolean\">"};
-    for (std::size_t i = 0; i < tags.size(); ++i) {
-        keep(tags[i], drive, static_cast<int>(i));
+    const std::vector<std::string> tags{size, name, state};
+    for (int number = 0; number < 3; ++number) {
+        memory.keep(tags[static_cast<std::size_t>(number)], numbered(number));
     }
-    for (std::size_t first = 0; first < tags.size(); ++first) {
-        for (std::size_t second = 0; second < tags.size(); ++second) {
-            EXPECT_EQ(recall(tags[first], drive), static_cast<int>(first));
-            EXPECT_EQ(recall(tags[second], drive), static_cast<int>(second));
+    for (int first = 0; first < 3; ++first) {
+        for (int second = 0; second < 3; ++second) {
+            EXPECT_EQ(recall(tags[static_cast<std::size_t>(first)]), first);
+            EXPECT_EQ(recall(tags[static_cast<std::size_t>(second)]), second);
         }
+        EXPECT_EQ(recall(end + "\n      "), ownName);
     }
 }
 
-TEST_F(RememberedTags, HaveAnAttributeAtLeast) {
-    const std::string shortest = "<as:a xsi:type=\"o:Fan\">?";  // 24 bytes
-    keep(shortest.substr(0, 23), drive, 1);
-    EXPECT_EQ(recall(shortest, drive), -1);
-    keep(shortest, drive, 2);
-    EXPECT_EQ(recall(shortest, drive), 2);
+TEST_F(RememberedTags, AreKeptAsTheyWereWrittenLast) {
+    const std::string otherwise = "<as:size id=\"3\" xsi:type=\"xsd:long\">";
+    memory.keep(size, numbered(0));
+    memory.keep(otherwise, numbered(0));
+    EXPECT_EQ(recall(otherwise), 0);
+    EXPECT_EQ(recall(size), unknownName);
 }
 
-TEST_F(RememberedTags, AreFewWhateverADocumentHolds) {
-    std::vector<std::string> tags;
-    for (int i = 0; i < 10'000; ++i) {
-        tags.push_back("<as:field" + std::to_string(i) + " xsi:type=\"xsd:int\">");
-    }
-    int recalled = 0;
-    for (const auto& tag : tags) {
-        keep(tag, drive, 1);
-    }
-    for (const auto& tag : tags) {
-        recalled += recall(tag, drive) == 1 ? 1 : 0;
-    }
-    EXPECT_EQ(recalled, 255);
+TEST_F(RememberedTags, IncludeTheEndTagOfTheElement) {
+    EXPECT_EQ(recall(end + "<ac:channel>"), ownName);
+    EXPECT_EQ(recall("</ac:channel>   "), unknownName);
+    EXPECT_EQ(recall("</ac:hardDrives>"), unknownName);
 }
 
-TEST(SeedOfAClass, IsAnotherForEachElement) {
-    EXPECT_NE(seedOf("ac:fan"), seedOf("ac:nfa"));
-    EXPECT_NE(seedOf("ac:arrays"), seedOf("ac:array"));
+TEST(TheFollower, IsFoundWithoutASearch) {
+    // Too short for the index, so that only the tag that is expected is found.
+    const std::string tag = "<as:size>";
+    TagMemories memories;
+    auto& memory = memories.of(drive);
+    memory.keep(tag, {{}, 0});
+    EXPECT_EQ(memory.recall(tag), nullptr);  // as:name is expected
+    memory.keep(tag, {{}, 0});
+    EXPECT_NE(memory.recall(tag), nullptr);  // it came after itself
+}
+
+TEST(TagMemories, HaveRoomForEveryClass) {
+    TagMemories memories;
+    const std::vector<Names> classes(1000, drive);
+    for (const auto& each : classes) {
+        memories.of(each).keep(size, {{}, 0});
+    }
+    for (const auto& each : classes) {
+        auto& memory = memories.of(each);
+        const auto* const recalled = memory.recall(size);
+        ASSERT_NE(recalled, nullptr);
+        EXPECT_EQ(recalled->bytes.data(), size.data());
+    }
 }
 
 }  // namespace
