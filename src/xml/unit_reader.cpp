@@ -2,6 +2,8 @@
 
 namespace raid::xml {
 
+void UnitReader::passSpaceBeforeTag() noexcept { at = passSpace(at, end); }
+
 const NamedUnit& UnitReader::readNamed(TagMemory& children) {
     const auto unit = next();
     current = {unit, children.numberOf(unit.name)};

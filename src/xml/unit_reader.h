@@ -47,7 +47,7 @@ public:
     const NamedUnit& next(TagMemory& children) {
         if (at < plainEnd) {
             if (*at != '<') {
-                at = passSpace(at, end);
+                passSpaceBeforeTag();
             }
             if (const auto* const tag = children.recall({at, between(at, end)})) {
                 at += tag->bytes.size();
@@ -78,6 +78,8 @@ public:
     int nesting = 0;
 
 private:
+    // Kept out of the loops over children, which are short without them.
+    void passSpaceBeforeTag() noexcept;
     const NamedUnit& readNamed(TagMemory& children);
 
     const char* start;
