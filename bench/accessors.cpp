@@ -3,7 +3,8 @@
 //
 //   bench_accessors DOCUMENT [arguments of the harness]
 //
-// names what the service answers with, which must be listening.
+// names what the service answers with, which must be listening. The times are those of the loop
+// around the calls, too, which the processor hides behind most of them.
 
 #include <array>
 #include <cstdio>
@@ -60,9 +61,11 @@ std::vector<Benchmark> ofDrives() {
         serialNumbers.push_back(drive.getSerialNumber());
     }
     return {
-        accessor("nothing", drives, [](int position) { use(position); }),
-        accessor("count/library", drives, [](int /*position*/) { use(getRAIDDiskDriveCount()); }),
-        accessor("count/list", drives, [](int /*position*/) { use(RAIDDiskDriveList.size()); }),
+        accessor("the loop", drives, [](int position) { use(position); }),
+        accessor("count/library", drives,
+                 [](int position) { use(position + getRAIDDiskDriveCount()); }),
+        accessor("count/list", drives,
+                 [](int position) { use(position + static_cast<int>(RAIDDiskDriveList.size())); }),
         accessor("number/library", drives,
                  [](int position) { use(getRAIDDiskDriveSize(position)); }),
         accessor("number/list", drives,

@@ -53,6 +53,34 @@ void requireSameOutcome(const Text& text) {
     }
 }
 
+bool refuses(const Reader& reader, const Text& text) {
+    try {
+        read(reader, text);
+        return reader.model() == nullptr;
+    } catch (const std::exception&) {
+        return true;
+    }
+}
+
+/// The text with the first of something replaced.
+Text broken(const Text& text, const std::string& found, const std::string& instead) {
+    auto bytes = *text.bytes;
+    bytes.replace(bytes.find(found), found.size(), instead);
+    return {text.name + " with " + instead, std::make_shared<const std::string>(bytes)};
+}
+
+void requireSameErrors(const Text& text) {
+    for (const auto& wrong :
+         {broken(text, "<as:vendor xsi:type=\"xsd:string\">", "<as:vendor/><as:x>"),
+          broken(text, "</as:vendor>", "</as:model>")}) {
+        for (const auto& reader : readers()) {
+            if (!refuses(reader, wrong)) {
+                throw std::runtime_error(std::string(reader.name) + " accepts " + wrong.name);
+            }
+        }
+    }
+}
+
 /// The copy of the document that is read is made before the time begins.
 std::chrono::nanoseconds timeOfReading(const Reader& reader, const Text& text, bool publishes) {
     auto copy = copyOf(*text.bytes);
@@ -108,25 +136,6 @@ void addEvents(Benchmarks& to, const Text& text) {
     });
 }
 
-void addLogLevels(Benchmarks& to, const Text& text) {
-    for (const int level : {0, 1, 8}) {
-        add(to, "log/" + text.name + "/level " + std::to_string(level), text, [text, level] {
-            LOG_LEVEL = level;
-            const auto time = timeOfReading(readers().front(), text, true);
-            LOG_LEVEL = 0;
-            return time;
-        });
-    }
-    constexpr int calls = 1000;
-    to.push_back({"log/" + std::to_string(calls) + " calls below the level", calls, [] {
-                      return processorTime([] {
-                          for (int i = 0; i < calls; ++i) {
-                              debug(9, "not written\n");
-                          }
-                      });
-                  }});
-}
-
 /// Of the sizes and shapes, what the folder has; a quick run makes fewer.
 Benchmarks benchmarksFor(const std::string& folder) {
     configRead = 1;
@@ -136,6 +145,7 @@ Benchmarks benchmarksFor(const std::string& folder) {
     const auto text = [&file](const std::string& name) {
         return Text{name, std::make_shared<const std::string>(load(file(name)))};
     };
+    requireSameErrors(text("small-compact"));
     Benchmarks made;
     for (const std::string size : {"small", "1MB", "20MB", "100MB"}) {
         for (const auto* const shape : {"-compact", "-indented", "-shuffled"}) {
@@ -149,7 +159,6 @@ Benchmarks benchmarksFor(const std::string& folder) {
     }
     addEvents(made, text("events-100"));
     addEvents(made, text("events-10000"));
-    addLogLevels(made, text("small-compact"));
     return made;
 }
 

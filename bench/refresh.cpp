@@ -1,9 +1,11 @@
 // Whole refreshes and event batches over the loopback, from request to published lists, against
-// the exchange of the same bytes alone.
+// the exchange of the same bytes alone; and what the log adds.
 //
 //   bench_refresh DOCUMENT [arguments of the harness]
 //
-// names what the service answers with, which must be listening and keep at least a hundred events.
+// names what the service answers with, which must be listening and keep a hundred events.
+
+#include <filesystem>
 
 #include "RAIDInstrumentation.h"
 #include "agent/agent_link.h"
@@ -46,15 +48,41 @@ void exchangeBatch() {
     use(answerTo(agent::eventsRequest(firstEvent, firstEvent + batchSize)));
 }
 
+std::chrono::nanoseconds timeOfLoggedRefresh(int level) {
+    LOG_LEVEL = level;
+    const auto time = passingTime([] { RAIDinit(); });
+    LOG_LEVEL = 0;
+    return time;
+}
+
+/// As it is written from the folder that scripts/bench runs this in.
+void requireLog() {
+    LOG_LEVEL = 1;
+    debug(1, "measured\n");
+    LOG_LEVEL = 0;
+    if (!std::filesystem::exists("../logs/RAIDInstrumentation.log")) {
+        throw std::runtime_error("the log cannot be written from here");
+    }
+}
+
+std::chrono::nanoseconds timeOfCallsBelowTheLevel(int calls) {
+    return processorTime([calls] {
+        for (int i = 0; i < calls; ++i) {
+            debug(9, "not written\n");
+        }
+    });
+}
+
 std::vector<Benchmark> benchmarksFor(const std::string& document) {
     configRead = 1;
+    requireLog();
     RAIDinit();
     if (RAIDDiskDriveList.empty()) {
         throw std::runtime_error("no service answers with a configuration");
     }
     readBatch();
-    if (RAIDEventList.size() < batchSize) {
-        throw std::runtime_error("the service has too few events");
+    if (RAIDEventList.size() != batchSize) {
+        throw std::runtime_error("the service has not a hundred events");
     }
     const auto measured = [](std::string name, auto work) {
         return Benchmark{std::move(name), 1, [work] { return passingTime(work); }};
@@ -69,6 +97,13 @@ std::vector<Benchmark> benchmarksFor(const std::string& document) {
         made.push_back(measured("refresh/" + document + "/" + std::string(reader.name),
                                 [&reader] { refreshWith(reader); }));
     }
+    for (const int level : {0, 1, 8}) {
+        made.push_back({"log/a refresh of " + document + " at level " + std::to_string(level), 1,
+                        [level] { return timeOfLoggedRefresh(level); }});
+    }
+    constexpr int calls = 1000;
+    made.push_back({"log/" + std::to_string(calls) + " calls below the level beside " + document,
+                    calls, [] { return timeOfCallsBelowTheLevel(calls); }});
     return made;
 }
 

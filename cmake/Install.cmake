@@ -19,13 +19,13 @@ set(publicHeaders
     flat/packing.h
     flat/snapshot.h
     model/arrays.h
-    model/blank.h
     model/channels_and_drives.h
     model/enclosures.h
     model/logical_drives.h
     model/system_and_adapter.h
     xml/parse_def_unit.h
-    xml/raid_xml_error.h)
+    xml/raid_xml_error.h
+    xml/blank.h)
 foreach(header IN LISTS publicHeaders)
     cmake_path(GET header PARENT_PATH folder)
     install(FILES "${PROJECT_SOURCE_DIR}/src/${header}"

@@ -73,3 +73,17 @@ buildPreset() {
     quietly "build/$preset/build.log" \
         cmake --build --preset "$preset" --parallel "$jobs" --target "${targets[@]}"
 }
+
+# The instructions of a function and all that it calls: countInstructions <function> <program> <arguments>...
+# The C library's functions choose their code by the processor; here they take what all have.
+countInstructions() {
+    local function=$1 log=build/callgrind.log
+    shift
+    GLIBC_TUNABLES=glibc.cpu.hwcaps=-AVX2,-AVX,-BMI2,-ERMS,-FSRM,-SSE4_2,-SSE4_1,-SSSE3 \
+        valgrind --tool=callgrind --callgrind-out-file=build/callgrind.out --toggle-collect="$function" \
+        "$@" >/dev/null 2>"$log" || {
+        cat "$log" >&2
+        return 1
+    }
+    sed -n 's/.*Collected : //p' "$log"
+}

@@ -7,6 +7,7 @@ namespace raid::bench {
 int measure(std::vector<Benchmark> benchmarks, int argc, char** argv) {
     for (const auto& each : benchmarks) {
         benchmark::RegisterBenchmark(each.name.c_str(), [&each](benchmark::State& state) {
+            each.run();  // which disposes of what the benchmark before this one left
             for ([[maybe_unused]] const auto round : state) {
                 state.SetIterationTime(std::chrono::duration<double>(each.run()).count());
             }

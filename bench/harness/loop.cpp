@@ -28,6 +28,7 @@ std::map<std::string, std::string, std::less<>> optionsOf(int argc, char** argv)
 
 /// Nanoseconds a run, over as many runs as fill the time.
 double oneRepetition(const Benchmark& benchmark, std::chrono::duration<double> atLeast) {
+    benchmark.run();  // which disposes of what the benchmark before this one left
     std::chrono::nanoseconds taken{};
     int runs = 0;
     do {

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "../model/blank.h"
+#include "../xml/blank.h"
 
 // A batch of controller events. All classes are plain values: getters return copies, and a text or
 // a number that the document does not have stays empty or 0. A reading constructor takes the text

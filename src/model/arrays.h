@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "blank.h"
+#include "../xml/blank.h"
 #include "channels_and_drives.h"
 #include "logical_drives.h"
 

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "blank.h"
+#include "../xml/blank.h"
 #include "enclosures.h"
 
 // An adapter's physical side. Codes and units are the service's own. All classes are plain values:

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "blank.h"
+#include "../xml/blank.h"
 
 // An enclosure on a channel and its parts. Codes are the service's own. All classes are plain
 // values: getters return copies, and a text or a number that the document does not have stays

@@ -3,7 +3,7 @@
 #include <string>
 #include <vector>
 
-#include "blank.h"
+#include "../xml/blank.h"
 
 // Logical drives, as they stand under the adapter and again inside each array. Codes and units are
 // the service's own. All classes are plain values: getters return copies, and a text or a number

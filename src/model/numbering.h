@@ -26,7 +26,7 @@ public:
 
 private:
     // Filled once and dropped whole, so that the entries need no freeing one by one.
-    std::pmr::monotonic_buffer_resource storage;
+    std::pmr::monotonic_buffer_resource storage{std::pmr::new_delete_resource()};
     std::pmr::unordered_map<std::uint64_t, int> arrayOfDrive{&storage};
     std::pmr::unordered_map<int, int> arrayOfLogicalDrive{&storage};
 };

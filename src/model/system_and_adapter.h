@@ -3,8 +3,8 @@
 #include <string>
 #include <vector>
 
+#include "../xml/blank.h"
 #include "arrays.h"
-#include "blank.h"
 #include "channels_and_drives.h"
 #include "logical_drives.h"
 

@@ -51,6 +51,7 @@ int numberOf(std::string_view name) {
     return name == Vocabulary<Model>::words.element ? ownName : unknownName;
 }
 
+/// What the class knows of the tags inside its element.
 template <class Model>
 inline constexpr Names namesOf{&numberOf<Model>, UsualTags<Model>::known,
                                TagIndex(UsualTags<Model>::beginnings)};
@@ -147,9 +148,9 @@ void requireEnd(const NamedUnit& found) {
 
 template <class Model>
 void readChildren(Model& model, UnitReader& units) {
-    auto& children = units.childrenOf(namesOf<Model>);
+    auto& tags = units.tagsOf(namesOf<Model>);
     for (;;) {
-        const auto& found = units.next(children);
+        const auto& found = units.next(tags);
         const auto& unit = found.unit;
         if (found.number < 0 || !unit.opening || !unit.finished) {
             requireEnd<Model>(found);

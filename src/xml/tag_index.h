@@ -13,7 +13,7 @@ namespace raid::xml {
 /// best, chosen when the library is compiled.
 class TagIndex {
 public:
-    /// By the tags or, where only that is known, their beginnings.
+    /// By the tags or, where only that is known, their beginnings; at most 256 of them.
     constexpr explicit TagIndex(std::span<const std::string_view> tags) noexcept {
         for (const auto tag : tags) {
             shortest = std::min(shortest, tag.size());
@@ -46,6 +46,7 @@ private:
         const auto byte = [text](std::size_t at) {
             return static_cast<std::size_t>(static_cast<unsigned char>(text[at]));
         };
+        // By an odd factor, so that two bytes that are exchanged make another sum.
         return (byte(first) * 0x25U + byte(second)) % slots;
     }
 
@@ -67,7 +68,10 @@ private:
 
     static constexpr std::size_t slots = 256;
 
-    std::size_t shortest = 32;
+    // Behind that the tags differ no more, and every pair before it is tried.
+    static constexpr std::size_t furthest = 32;
+
+    std::size_t shortest = furthest;
     std::size_t first = 0;
     std::size_t second = 0;
     std::array<std::uint8_t, slots> places{};

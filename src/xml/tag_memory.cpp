@@ -6,10 +6,10 @@
 
 namespace raid::xml {
 
-TagMemory::TagMemory(const Names& known, std::pmr::memory_resource* room)
-    : names(known), tags(known.usual.size(), room), last(&tags.back()) {
+TagMemory::TagMemory(const Names& ofClass, std::pmr::memory_resource* room)
+    : names(ofClass), tags(ofClass.known.size(), room), last(&tags.back()) {
     for (std::size_t place = 0; place < tags.size(); ++place) {
-        static_cast<KnownTag&>(tags[place]) = known.usual[place];
+        static_cast<KnownTag&>(tags[place]) = ofClass.known[place];
         tags[place].follower = &tags[(place + 1) % tags.size()];
     }
 }
@@ -32,10 +32,10 @@ void TagMemory::keep(std::string_view bytes, const NamedUnit& found) noexcept {
     static_cast<KnownTag&>(follow(tags[static_cast<std::size_t>(found.number)])) = {bytes, found};
 }
 
-TagMemory& TagMemories::of(const Names& names) {
-    const auto known =
-        std::ranges::find_if(memories, [&](const TagMemory& memory) { return memory.isOf(names); });
-    return known != memories.end() ? *known : memories.emplace_front(names, &room);
+TagMemory& TagMemories::of(const Names& ofClass) {
+    const auto met = std::ranges::find_if(
+        memories, [&](const TagMemory& memory) { return memory.isOf(ofClass); });
+    return met != memories.end() ? *met : memories.emplace_front(ofClass, &room);
 }
 
 }  // namespace raid::xml

@@ -40,7 +40,7 @@ struct Names {
     int (*numberOf)(std::string_view name) = nullptr;
     /// The start tags of the children by number, as far as it is known how the service writes
     /// them, and behind them the end tag of the element.
-    std::span<const KnownTag> usual;
+    std::span<const KnownTag> known;
     TagIndex index;  // of the start tags
 };
 
@@ -51,7 +51,7 @@ struct Names {
 class TagMemory {
 public:
     /// The children are expected in the order of their numbers until it is seen otherwise.
-    TagMemory(const Names& known, std::pmr::memory_resource* room);
+    TagMemory(const Names& ofClass, std::pmr::memory_resource* room);
     TagMemory(const TagMemory&) = delete;
     TagMemory& operator=(const TagMemory&) = delete;
     ~TagMemory() = default;
@@ -71,7 +71,7 @@ public:
     /// Remembers how the child with the number of the found unit is written.
     void keep(std::string_view bytes, const NamedUnit& found) noexcept;
 
-    [[nodiscard]] bool isOf(const Names& known) const noexcept { return &names == &known; }
+    [[nodiscard]] bool isOf(const Names& ofClass) const noexcept { return &names == &ofClass; }
 
 private:
     struct Tag : KnownTag {
@@ -84,7 +84,7 @@ private:
     Tag& follow(Tag& tag) noexcept;
 
     const Names& names;
-    std::pmr::vector<Tag> tags;  // in the order of names.usual; never moved
+    std::pmr::vector<Tag> tags;  // in the order of names.known; never moved
     Tag* last;                   // the end of an element is before the beginning of the next
 };
 
@@ -96,13 +96,13 @@ public:
     TagMemories& operator=(const TagMemories&) = delete;
     ~TagMemories() = default;
 
-    TagMemory& of(const Names& names);
+    TagMemory& of(const Names& ofClass);
 
 private:
     // Enough for the vocabulary of the configuration, so that it costs one allocation.
     static constexpr std::size_t usualSize = 16 * 1024;
 
-    std::pmr::monotonic_buffer_resource room{usualSize};
+    std::pmr::monotonic_buffer_resource room{usualSize, std::pmr::new_delete_resource()};
     std::pmr::forward_list<TagMemory> memories{&room};
 };
 

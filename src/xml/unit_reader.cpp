@@ -4,11 +4,11 @@ namespace raid::xml {
 
 void UnitReader::passSpaceBeforeTag() noexcept { at = passSpace(at, end); }
 
-const NamedUnit& UnitReader::readNamed(TagMemory& children) {
+const NamedUnit& UnitReader::readNamed(TagMemory& tags) {
     const auto unit = next();
-    current = {unit, children.numberOf(unit.name)};
+    current = {unit, tags.numberOf(unit.name)};
     if (unit.opening && unit.finished && current.number >= 0) {
-        children.keep({before, between(before, at)}, current);
+        tags.keep({before, between(before, at)}, current);
     }
     return current;
 }

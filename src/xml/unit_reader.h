@@ -40,21 +40,21 @@ public:
         return next();
     }
 
-    /// What the document has shown of the children of a class.
-    TagMemory& childrenOf(const Names& names) { return memories.of(names); }
+    /// What the document has shown of the tags inside the elements of a class.
+    TagMemory& tagsOf(const Names& names) { return memories.of(names); }
 
     /// The next unit and the number of its name. The reference holds until the next call.
-    const NamedUnit& next(TagMemory& children) {
+    const NamedUnit& next(TagMemory& tags) {
         if (at < plainEnd) {
             if (*at != '<') {
                 passSpaceBeforeTag();
             }
-            if (const auto* const tag = children.recall({at, between(at, end)})) {
+            if (const auto* const tag = tags.recall({at, between(at, end)})) {
                 at += tag->bytes.size();
                 return tag->found;
             }
         }
-        return readNamed(children);
+        return readNamed(tags);
     }
 
     /// The rest of a simple element, text and end tag, where it comes in its plainest form: returns
@@ -80,7 +80,7 @@ public:
 private:
     // Kept out of the loops over children, which are short without them.
     void passSpaceBeforeTag() noexcept;
-    const NamedUnit& readNamed(TagMemory& children);
+    const NamedUnit& readNamed(TagMemory& tags);
 
     const char* start;
     const char* at;

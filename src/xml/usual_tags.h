@@ -34,6 +34,7 @@ constexpr std::string_view usualType(typename Child<Model>::Kind kind) {
 template <class Model>
 class UsualTags {
     static constexpr auto& children = childrenOf<Model>;
+    static_assert(children.size() <= 256, "the index counts so far");
     static constexpr std::string_view element = Vocabulary<Model>::words.element;
 
     /// Calls back with the pieces of each tag, first of all start tags, then of all end tags.
@@ -101,7 +102,7 @@ public:
         return views;
     }();
 
-    /// What Names calls usual.
+    /// For Names.
     static constexpr auto known = [] {
         std::array<KnownTag, children.size() + 1> made{};
         for (std::size_t number = 0; number < children.size(); ++number) {

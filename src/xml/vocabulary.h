@@ -8,7 +8,7 @@
 #include <utility>
 #include <vector>
 
-#include "model/blank.h"
+#include "xml/blank.h"
 #include "xml/unit_reader.h"
 
 namespace raid::xml {
@@ -42,8 +42,7 @@ struct Words {
 ///
 ///     words          what it is called
 ///     type           the member that keeps the "xsi:type" attribute
-///     children       its vocabulary, a tuple with one row a child; without it the element's
-///     content is passed
+///     children       its vocabulary, a tuple with one row a child; an element without it is passed
 ///                    over up to its own end tag
 ///     nestingLimit   for an element that can contain itself: how deep
 template <class Model>

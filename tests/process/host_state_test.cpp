@@ -12,6 +12,7 @@
 #include <csignal>
 #include <filesystem>
 #include <map>
+#include <memory_resource>
 #include <string>
 #include <vector>
 
@@ -116,6 +117,16 @@ TEST_F(TheHost, HasNoThreadAndNoChildOfTheLibrary) {
     EXPECT_EQ(std::distance(begin(tasks), end(tasks)), 1);
     EXPECT_EQ(waitpid(-1, nullptr, WNOHANG), -1);
     EXPECT_EQ(errno, ECHILD);
+}
+
+TEST_F(TheHost, MayHaveADefaultMemoryResourceOfItsOwn) {
+    std::pmr::set_default_resource(std::pmr::null_memory_resource());
+    {
+        const ScriptedService service({answering(fullAnswers().configuration)});
+        EXPECT_NO_THROW(RAIDinit());
+    }
+    std::pmr::set_default_resource(nullptr);
+    EXPECT_GT(getRAIDDiskDriveCount(), 0);
 }
 
 }  // namespace

@@ -37,7 +37,7 @@ protected:
     static NamedUnit numbered(int number) { return {{.isTag = true, .opening = true}, number}; }
 
     // The number that was kept with the tag; -2 when it is not known.
-    int recall(const std::string& text) {
+    int recall(std::string_view text) {
         const auto* const tag = memory.recall(text);
         return tag == nullptr ? unknownName : tag->found.number;
     }
@@ -59,7 +59,7 @@ TEST_F(RememberedTags, AreRecalledByTheirBytesAtTheFrontOfAText) {
 TEST_F(RememberedTags, AreRecalledWholeOnly) {
     memory.keep(size, numbered(0));
     for (std::size_t length = 0; length < size.size(); ++length) {
-        EXPECT_EQ(recall(size.substr(0, length)), unknownName) << length;
+        EXPECT_EQ(recall(std::string_view(size).substr(0, length)), unknownName) << length;
     }
     for (std::size_t place = 0; place < size.size(); ++place) {
         auto other = size;

@@ -98,11 +98,18 @@ TEST_F(TokenizerTrace, ShowsAZeroByteAsTheEndOfItsLine) {
 
 TEST_F(TokenizerTrace, ShowsNamesOfAnyLength) {
     const std::string name(1000, 'n');
-    EXPECT_TRUE(traceOf(name + "<").ends_with("CDATA " + name + "\n"));
+    EXPECT_TRUE(traceOf("<" + name + ">").ends_with("element " + name + "\n"));
+}
+
+TEST_F(TokenizerTrace, ShowsTextsOfAnyLength) {
+    const std::string text(1000, 't');
+    EXPECT_TRUE(traceOf(text + "<").ends_with("CDATA " + text + "\n"));
 }
 
 TEST_F(TokenizerTrace, ShowsOnlyTheEntryForALengthBelowOne) {
     EXPECT_EQ(traceOf(""), "Enter ParseDefUnit length=0\n");
+    const ParseDefUnit unit("<a>", -1);
+    EXPECT_EQ(readLog(), "Enter ParseDefUnit length=0\nEnter ParseDefUnit length=-1\n");
 }
 
 TEST_F(TokenizerTrace, IsSilentBelowLevel9) { EXPECT_EQ(traceOf("<a b='c'/>", 8), ""); }

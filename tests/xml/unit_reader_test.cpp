@@ -48,15 +48,15 @@ const std::string sizeTag = "<as:size xsi:type=\"xsd:int\">";
 TEST_F(UnitReading, NumbersTheNameOfEveryUnit) {
     const std::string text = "<a>" + sizeTag + " five </as:size><unfinished";
     auto units = readerOf(text);
-    EXPECT_EQ(units.next(units.childrenOf(lengths)).number, 1);
-    EXPECT_EQ(units.next(units.childrenOf(lengths)).number, 7);
-    const auto& five = units.next(units.childrenOf(lengths));
+    EXPECT_EQ(units.next(units.tagsOf(lengths)).number, 1);
+    EXPECT_EQ(units.next(units.tagsOf(lengths)).number, 7);
+    const auto& five = units.next(units.tagsOf(lengths));
     EXPECT_EQ(five.number, 4);
     EXPECT_FALSE(five.unit.isTag);
     EXPECT_EQ(five.unit.name, "five");
-    EXPECT_TRUE(units.next(units.childrenOf(lengths)).unit.closing);
-    EXPECT_FALSE(units.next(units.childrenOf(lengths)).unit.finished);
-    EXPECT_FALSE(units.next(units.childrenOf(lengths)).unit.finished);
+    EXPECT_TRUE(units.next(units.tagsOf(lengths)).unit.closing);
+    EXPECT_FALSE(units.next(units.tagsOf(lengths)).unit.finished);
+    EXPECT_FALSE(units.next(units.tagsOf(lengths)).unit.finished);
 }
 
 TEST_F(UnitReading, LooksUpTheNameOfARepeatedTagOnce) {
@@ -66,7 +66,7 @@ TEST_F(UnitReading, LooksUpTheNameOfARepeatedTagOnce) {
     }
     auto units = readerOf(text);
     for (int i = 0; i < 10; ++i) {
-        const auto& size = units.next(units.childrenOf(lengths));
+        const auto& size = units.next(units.tagsOf(lengths));
         EXPECT_EQ(size.number, 7);
         EXPECT_TRUE(size.unit.isTag);
         EXPECT_TRUE(size.unit.opening);
@@ -74,7 +74,7 @@ TEST_F(UnitReading, LooksUpTheNameOfARepeatedTagOnce) {
         EXPECT_TRUE(size.unit.finished);
         EXPECT_EQ(size.unit.name, "as:size");
         EXPECT_EQ(size.unit.type, "xsd:int");
-        EXPECT_EQ(units.next(units.childrenOf(lengths)).unit.type, "xsd:string");
+        EXPECT_EQ(units.next(units.tagsOf(lengths)).unit.type, "xsd:string");
     }
     EXPECT_EQ(asked, 2);
     EXPECT_EQ(units.remaining(), 0);
@@ -83,10 +83,10 @@ TEST_F(UnitReading, LooksUpTheNameOfARepeatedTagOnce) {
 TEST_F(UnitReading, LooksANameUpForEachClass) {
     const std::string text = sizeTag + sizeTag + sizeTag;
     auto units = readerOf(text);
-    units.next(units.childrenOf(lengths));
-    units.next(units.childrenOf(otherLengths));
+    units.next(units.tagsOf(lengths));
+    units.next(units.tagsOf(otherLengths));
     EXPECT_EQ(asked, 2);
-    units.next(units.childrenOf(lengths));
+    units.next(units.tagsOf(lengths));
     EXPECT_EQ(asked, 2);
 }
 
@@ -94,8 +94,8 @@ TEST_F(UnitReading, RecallsNothingForTheTrace) {
     writeLogLevel(9);
     const std::string text = sizeTag + sizeTag;
     auto units = readerOf(text);
-    units.next(units.childrenOf(lengths));
-    EXPECT_EQ(units.next(units.childrenOf(lengths)).unit.name, "as:size");
+    units.next(units.tagsOf(lengths));
+    EXPECT_EQ(units.next(units.tagsOf(lengths)).unit.name, "as:size");
     EXPECT_EQ(asked, 2);
     const auto log = readLog();
     EXPECT_NE(log.find("element as:size\n"), log.rfind("element as:size\n"));
@@ -136,6 +136,15 @@ TEST_F(UnitReading, LeavesATextThatEndsInAnyOtherWay) {
     }
 }
 
+TEST_F(UnitReading, LooksForAPlainTextUpToItsLengthOnly) {
+    const std::string text = "5</as:size>";
+    for (int length = 0; length < static_cast<int>(text.size()); ++length) {
+        UnitReader units(text.data(), length);
+        EXPECT_EQ(units.plainText("</as:size>"), std::nullopt) << length;
+        EXPECT_EQ(units.remaining(), length);
+    }
+}
+
 TEST_F(UnitReading, TakesNoShortWayPastTheTrace) {
     writeLogLevel(9);
     const std::string end = "</as:size>";
@@ -148,7 +157,7 @@ TEST_F(UnitReading, TakesNoShortWayPastTheTrace) {
 TEST_F(UnitReading, ReadsNothingOfANegativeLength) {
     UnitReader units("<a>", -1);
     EXPECT_FALSE(units.next().finished);
-    EXPECT_FALSE(units.next(units.childrenOf(lengths)).unit.finished);
+    EXPECT_FALSE(units.next(units.tagsOf(lengths)).unit.finished);
     EXPECT_EQ(units.consumed(), 0);
 }
 
