@@ -12,6 +12,7 @@
 #include "agent/document.h"
 #include "agent/exchange.h"
 #include "agent/requests.h"
+#include "diag/debug.h"
 #include "flat/lists.h"
 #include "flat/snapshot.h"
 #include "harness/harness.h"

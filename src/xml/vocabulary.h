@@ -1,6 +1,8 @@
 #pragma once
 
+#include <algorithm>
 #include <array>
+#include <atomic>
 #include <string>
 #include <string_view>
 #include <tuple>
@@ -123,8 +125,18 @@ struct Each {
 
     template <class Read>
     static void keep(Model& parent, Read read) {
-        read(Unread::appendTo(parent.*list));
+        auto& items = parent.*list;
+        if (items.capacity() == 0) {
+            items.reserve(std::min(usualLength.load(std::memory_order_relaxed), mostReserved));
+        }
+        read(Unread::appendTo(items));
+        usualLength.store(items.size(), std::memory_order_relaxed);
     }
+
+    // Lists of one kind are mostly as long as the one before, also that of the refresh before.
+    static inline std::atomic<std::size_t> usualLength = 0;
+    // What a long list makes a short one waste is bounded.
+    static constexpr std::size_t mostReserved = 64;
 
     std::string_view name;
 };
