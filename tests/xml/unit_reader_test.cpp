@@ -92,9 +92,11 @@ TEST_F(UnitReading, LooksANameUpForEachClass) {
 
 TEST_F(UnitReading, RecallsNothingForTheTrace) {
     writeLogLevel(9);
-    const std::string text = sizeTag + sizeTag;
+    const std::string text = " " + sizeTag + sizeTag;
     auto units = readerOf(text);
     units.next(units.tagsOf(lengths));
+    EXPECT_TRUE(
+        readLog().starts_with("Enter ParseDefUnit length=57\nstate 0, char  \nstate 0, char <"));
     EXPECT_EQ(units.next(units.tagsOf(lengths)).unit.name, "as:size");
     EXPECT_EQ(asked, 2);
     const auto log = readLog();
