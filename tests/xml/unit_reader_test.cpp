@@ -80,6 +80,20 @@ TEST_F(UnitReading, LooksUpTheNameOfARepeatedTagOnce) {
     EXPECT_EQ(units.remaining(), 0);
 }
 
+TEST_F(UnitReading, LooksUpTheNameOfTheFirstChildOnce) {
+    constexpr auto beyondSix = [](std::string_view name) { return lengthOfName(name) - 7; };
+    constexpr std::array<std::string_view, 2> ofChildren{"<as:size xsi:type=",
+                                                         "<as:state xsi:type="};
+    static constexpr std::array<KnownTag, 3> unseen{};
+    static constexpr Names names{beyondSix, unseen, TagIndex(ofChildren)};
+    const std::string text = sizeTag + sizeTag + sizeTag;
+    auto units = readerOf(text);
+    for (int i = 0; i < 3; ++i) {
+        EXPECT_EQ(units.next(units.tagsOf(names)).number, 0);
+    }
+    EXPECT_EQ(asked, 1);
+}
+
 TEST_F(UnitReading, LooksANameUpForEachClass) {
     const std::string text = sizeTag + sizeTag + sizeTag;
     auto units = readerOf(text);
