@@ -1,7 +1,10 @@
 #pragma once
 
+#include <cstddef>
 #include <stdexcept>
 #include <string>
+
+#include "bounds.h"
 
 namespace raidsim {
 
@@ -10,7 +13,13 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-// The bytes of a regular file of at most bounds::fileBytes. Throws FileError.
-[[nodiscard]] std::string readFile(const std::string& path);
+// The bytes of a regular file, which is refused when it is too large. Throws FileError.
+[[nodiscard]] std::string readFile(const std::string& path, std::size_t most = bounds::fileBytes);
+
+// The folder that holds a file; empty when the path names none.
+[[nodiscard]] std::string folderOf(const std::string& path);
+
+// A path as it is written in a file of that folder.
+[[nodiscard]] std::string pathFrom(const std::string& folder, const std::string& path);
 
 }  // namespace raidsim

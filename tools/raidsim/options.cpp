@@ -2,12 +2,39 @@
 
 #include <CLI/CLI.hpp>
 
+#include "text.h"
+
 namespace raidsim {
 
 namespace {
 
 // Sizes of a rack that the service's numbers still tell apart.
 const CLI::Range rackNumber(0, 100'000);
+
+constexpr const char* description =
+    "Simulates the RAID management service on 127.0.0.1: serves the configuration CONFIG, or what "
+    "was\n"
+    "recorded of another service, and obeys lines on its standard input (\"help\" lists them).";
+
+constexpr const char* footer =
+    "Examples:\n"
+    "  raidsim examples/small-server.xml\n"
+    "      serves a document until Ctrl-C\n"
+    "  raidsim --scenario examples/scenarios/disk-failure.scenario --speed 10\n"
+    "      plays a scenario, which names its configuration, in a tenth of its time\n"
+    "  raidsim --scenario examples/scenarios/disk-failure.scenario --clock virtual\n"
+    "      stands still until it is told \"advance SECONDS\"\n"
+    "  raidsim --init examples/small-server.init --fault faults/connection/reset-in-body.fault \\\n"
+    "          examples/small-server.xml\n"
+    "      has some events, and resets the first connection\n"
+    "  raidsim --replay monday.rec --speed 60\n"
+    "      answers as the recorded service did, an hour in a minute\n"
+    "  raidsim generate --adapters 4 --channels 2 --drives 24 >rack.xml\n"
+    "      writes a document of any size\n"
+    "\n"
+    "Exit status: 0 told to quit, 64 wrong command line, 65 a file is malformed, 66 a file cannot "
+    "be\n"
+    "read, 69 cannot listen, 70 internal error, 74 cannot write.";
 
 CLI::App* addGenerate(CLI::App& app, generate::Order& order) {
     auto* const command = app.add_subcommand(
@@ -31,22 +58,62 @@ CLI::App* addGenerate(CLI::App& app, generate::Order& order) {
     return command;
 }
 
+// What is served, and what happens to it.
+void addContent(CLI::App& app, Options& options) {
+    auto* const config = app.add_option(
+        "CONFIG", options.config, "Configuration document to serve, unless the scenario names one");
+    app.add_option("--replay", options.replay, "Recording to serve in place of a configuration")
+        ->excludes(config);
+    app.add_option("--init", options.init, "File of control commands to run before listening");
+    app.add_option("--scenario", options.scenario, "File of timed control commands to play");
+    app.add_option("--fault", options.fault, "Fault file whose cases the clients meet in turn");
+}
+
+void addTime(CLI::App& app, Options& options) {
+    app.add_option_function<std::string>(
+           "--clock",
+           [&options](const std::string& name) {
+               options.clock = name == "real" ? ClockKind::real : ClockKind::virtualTime;
+           },
+           "What moves the time of scenario and recording: \"real\" (the default), or \"virtual\": "
+           "only the command \"advance\"")
+        ->check(CLI::IsMember({"real", "virtual"}));
+    app.add_option_function<std::string>(
+        "--epoch",
+        [&options](const std::string& text) {
+            options.epoch = parseUtc(text);
+            if (!options.epoch)
+                throw CLI::ValidationError("--epoch",
+                                           text + " is no time such as 2026-11-21T17:48:00Z");
+        },
+        "Date (UTC) at which the virtual clock begins");
+    app.add_option("--speed", options.speed, "How much faster the real clock's time passes")
+        ->check(CLI::Range(0.001, 1e6))
+        ->capture_default_str();
+    app.add_option("--seed", options.seed, "Seed of the scenario's choices in place of its own");
+}
+
+void checkTogether(const CLI::App& app, const Options& options) {
+    if (options.config.empty() && options.scenario.empty() && options.replay.empty())
+        throw UsageError("CONFIG is required");
+    const bool real = options.clock == ClockKind::real;
+    if (real && options.epoch)
+        throw UsageError("--epoch needs --clock virtual");
+    if (!real && app.count("--speed") > 0)
+        throw UsageError("--speed needs --clock real");
+}
+
 }  // namespace
 
 Wanted parseOptions(int argc, const char* const* argv) {
     Options options;
     generate::Order order;
-    CLI::App app("Simulates the RAID management service on 127.0.0.1.", "raidsim");
-    app.add_option("CONFIG", options.config, "Configuration document to serve");
-    app.add_option("--init", options.init, "File of control commands to run before listening");
-    app.add_option("--scenario", options.scenario, "File of timed control commands to play");
-    app.add_option("--fault", options.fault, "Fault file whose cases the clients meet in turn");
-    app.add_option("--speed", options.speed, "How much faster the scenario's time passes")
-        ->check(CLI::Range(0.001, 1e6))
-        ->capture_default_str();
+    CLI::App app(description, "raidsim");
+    addContent(app, options);
+    addTime(app, options);
     app.add_option("--port", options.port, "Port to listen on; 0 picks a free one")
         ->capture_default_str();
-    app.footer("The service is controlled by lines on standard input; \"help\" lists them.");
+    app.footer(footer);
     const auto* const generating = addGenerate(app, order);
     try {
         app.parse(argc, argv);
@@ -57,8 +124,7 @@ Wanted parseOptions(int argc, const char* const* argv) {
     }
     if (generating->parsed())
         return order;
-    if (options.config.empty())
-        throw UsageError("CONFIG is required");
+    checkTogether(app, options);
     return options;
 }
 

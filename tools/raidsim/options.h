@@ -1,6 +1,8 @@
 #pragma once
 
+#include <chrono>
 #include <cstdint>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <variant>
@@ -9,11 +11,19 @@
 
 namespace raidsim {
 
+// What moves the scenario's time: the time of day, or only the operator.
+enum class ClockKind { real, virtualTime };
+
 struct Options {
+    // Paths; empty: none.
     std::string config;
-    std::string init;      // empty: none
-    std::string scenario;  // empty: none
-    std::string fault;     // empty: none
+    std::string replay;
+    std::string init;
+    std::string scenario;
+    std::string fault;
+    ClockKind clock = ClockKind::real;
+    std::optional<std::chrono::sys_seconds> epoch;
+    std::optional<std::uint64_t> seed;
     double speed = 1;
     std::uint16_t port = 34572;
 };

@@ -1,14 +1,13 @@
 #include "service.h"
 
 #include <array>
-#include <ctime>
-#include <iomanip>
 #include <limits>
-#include <sstream>
 #include <utility>
 
+#include "overloaded.h"
 #include "soap/envelope.h"
 #include "soap/request.h"
+#include "text.h"
 
 namespace raidsim {
 
@@ -18,22 +17,6 @@ constexpr std::string_view processor = "/SOAPService/DataProcessor";
 constexpr std::string_view monitor = "/SOAPService/RaidMonitor";
 
 constexpr std::pair everyEvent{std::numeric_limits<int>::min(), std::numeric_limits<int>::max()};
-
-std::string isoDate(std::chrono::system_clock::time_point when) {
-    const std::time_t seconds = std::chrono::system_clock::to_time_t(when);
-    std::tm parts{};
-    gmtime_r(&seconds, &parts);
-    std::ostringstream out;
-    out << std::put_time(&parts, "%Y-%m-%dT%H:%M:%SZ");
-    return out.str();
-}
-
-template <typename... Handlers>
-struct Overloaded : Handlers... {
-    using Handlers::operator()...;
-};
-template <typename... Handlers>
-Overloaded(Handlers...) -> Overloaded<Handlers...>;
 
 Service::Reply replyToCall(const soap::Request& call, const EventLog& log) {
     using Reply = Service::Reply;
@@ -66,6 +49,8 @@ std::optional<RequestKind> Service::kindOf(const http::Request& request) {
             return RequestKind::events;
         return std::nullopt;
     }
+    if (request.target != monitor)
+        return std::nullopt;
     try {
         return std::visit(Overloaded{
                               [](const soap::GetNewestEvent&) { return RequestKind::newest; },
@@ -79,6 +64,16 @@ std::optional<RequestKind> Service::kindOf(const http::Request& request) {
 }
 
 Service::Reply Service::reply(const http::Request& request) const {
+    if (!substitutes.empty()) {
+        const auto kind = kindOf(request);
+        const auto found = kind ? substitutes.find(*kind) : substitutes.end();
+        if (found != substitutes.end())
+            return found->second ? Reply(http::Answer{200, *found->second}) : Reply(NoAnswer{});
+    }
+    return ownReply(request);
+}
+
+Service::Reply Service::ownReply(const http::Request& request) const {
     const bool get = request.method == "GET";
     const std::string_view target = request.target;
     if (get && target == std::string(processor) + "?getConfig")
@@ -96,6 +91,9 @@ Service::Reply Service::reply(const http::Request& request) const {
 }
 
 std::string Service::goodBody(RequestKind kind) const {
+    const auto found = substitutes.find(kind);
+    if (found != substitutes.end() && found->second)
+        return *found->second;
     switch (kind) {
         case RequestKind::config:
         case RequestKind::any:
@@ -116,19 +114,28 @@ http::Answer Service::answerToWait(int sequenceNumber) {
 
 void Service::reload(const std::string& path) {
     const std::string& source = path.empty() ? file : path;
-    served = Document::read(source);
+    serve(Document::read(source));
     file = source;
 }
 
-int Service::addEvent(EventLog::Fields fields) {
+void Service::serve(Document next) {
+    served = std::move(next);
+    answerFromState(RequestKind::config);
+}
+
+void Service::substitute(RequestKind kind, std::optional<std::string> body) {
+    substitutes.insert_or_assign(kind, std::move(body));
+}
+
+EventLog::Fields Service::completed(EventLog::Fields fields) const {
     const std::array<std::pair<const char*, std::string>, 3> defaults{{
-        {"date", isoDate(clock())},
+        {"date", formatUtc(clock())},
         {"serverName", served.systemName()},
         {"serverAddress", "127.0.0.1"},
     }};
     // In front, so that a given value overrides.
     fields.insert(fields.begin(), defaults.begin(), defaults.end());
-    return log.append(fields);
+    return fields;
 }
 
 }  // namespace raidsim

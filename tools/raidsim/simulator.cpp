@@ -4,46 +4,34 @@
 
 #include <boost/system/system_error.hpp>
 #include <csignal>
+#include <memory>
 #include <ostream>
+#include <utility>
 
 #include "files.h"
+#include "text.h"
 
 namespace raidsim {
 
-namespace {
-
-// Reads a file in two steps that fail with different exit statuses.
-template <typename Parse>
-auto load(const std::string& path, Parse parse) {
-    std::string text;
-    try {
-        text = readFile(path);
-    } catch (const FileError& error) {
-        throw StartError(ExitStatus::noInput, path + ": " + error.what());
-    }
-    try {
-        return parse(text);
-    } catch (const std::runtime_error& error) {
-        throw StartError(ExitStatus::badInput, path + ": " + error.what());
-    }
-}
-
-std::vector<ScenarioStep> loadScenario(const std::string& path) {
-    return path.empty() ? std::vector<ScenarioStep>() : load(path, parseScenario);
-}
-
-}  // namespace
-
 Simulator::Simulator(const Options& options, std::ostream& replies, std::ostream& complaints)
+    : Simulator(options, startUp(options), replies, complaints) {}
+
+Simulator::Simulator(const Options& options, Startup startup, std::ostream& replies,
+                     std::ostream& complaints)
     : out(replies),
       err(complaints),
-      service(load(options.config, Document::parse), options.config),
-      scenario(loadScenario(options.scenario)),
+      player(std::move(startup.steps)),
       scenarioPath(options.scenario),
+      clock(options.clock),
+      epoch(startup.epoch),
       speed(options.speed),
+      service(std::move(startup.document), std::move(startup.documentPath),
+              [this] { return date(); }),
       scenarioTimer(context),
       signals(context, SIGINT, SIGTERM, SIGHUP) {
     service.faults().tell = [this](const std::string& line) { out << line << std::endl; };
+    if (!startup.warning.empty())
+        complain(startup.warning);
     runInit(options.init);
     armFault(options.fault);
     listen(options.port);
@@ -57,14 +45,17 @@ void Simulator::run() {
     input.emplace(context, STDIN_FILENO,
                   [this](std::optional<std::string_view> line) { obeyLine(line); });
     scenarioStart = std::chrono::steady_clock::now();
-    playScenario();
+    // Before any client is accepted.
+    playTo(std::chrono::milliseconds(0));
+    awaitStep();
     context.run();
 }
 
 void Simulator::runInit(const std::string& path) {
     if (path.empty())
         return;
-    for (const ScriptLine& line : load(path, parseScript)) {
+    const auto script = loading(path, [&] { return parseScript(readFile(path), folderOf(path)); });
+    for (const ScriptLine& line : script) {
         try {
             quitting = line.command(service).quit || quitting;
         } catch (const CommandError& error) {
@@ -77,13 +68,8 @@ void Simulator::runInit(const std::string& path) {
 void Simulator::armFault(const std::string& path) {
     if (path.empty())
         return;
-    try {
-        service.faults().arm(std::make_shared<const FaultFile>(path), std::nullopt);
-    } catch (const FileError& error) {
-        throw StartError(ExitStatus::noInput, path + ": " + error.what());
-    } catch (const FaultError& error) {
-        throw StartError(ExitStatus::badInput, path + ": " + error.what());
-    }
+    loading(path,
+            [&] { service.faults().arm(std::make_shared<const FaultFile>(path), std::nullopt); });
 }
 
 void Simulator::listen(std::uint16_t port) {
@@ -116,6 +102,8 @@ void Simulator::obey(const Command& command, const std::string& origin) {
         const Outcome outcome = command(service);
         if (!outcome.message.empty())
             out << outcome.message << std::endl;
+        if (outcome.advance)
+            advance(*outcome.advance);
         if (outcome.quit)
             quit();
     } catch (const CommandError& error) {
@@ -133,9 +121,22 @@ void Simulator::obeyLine(std::optional<std::string_view> line) {
     }
 }
 
-void Simulator::playScenario() {
-    const auto due = scenario.nextDue();
-    if (!due || quitting)
+std::chrono::sys_seconds Simulator::date() const {
+    using namespace std::chrono;
+    return clock == ClockKind::real ? floor<seconds>(system_clock::now())
+                                    : epoch + floor<seconds>(player.elapsed());
+}
+
+void Simulator::playTo(std::chrono::milliseconds elapsed) {
+    player.advanceTo(elapsed, [this](const ScriptLine& line) {
+        if (!quitting)
+            obey(line.command, scenarioPath + ": line " + std::to_string(line.number) + ": ");
+    });
+}
+
+void Simulator::awaitStep() {
+    const auto due = player.nextDue();
+    if (clock != ClockKind::real || !due || quitting)
         return;
     const auto scaled = std::chrono::duration<double, std::milli>(*due) / speed;
     scenarioTimer.expires_at(scenarioStart +
@@ -143,11 +144,16 @@ void Simulator::playScenario() {
     scenarioTimer.async_wait([this, due = *due](boost::system::error_code cancelled) {
         if (cancelled)
             return;
-        scenario.advanceTo(due, [this](const ScriptLine& line) {
-            obey(line.command, scenarioPath + ": line " + std::to_string(line.number) + ": ");
-        });
-        playScenario();
+        playTo(due);
+        awaitStep();
     });
+}
+
+void Simulator::advance(std::chrono::milliseconds time) {
+    if (clock == ClockKind::real)
+        throw CommandError("advance: the clock is real; start with --clock virtual");
+    playTo(player.elapsed() + time);
+    out << "time " << formatSeconds(player.elapsed()) << std::endl;
 }
 
 void Simulator::complain(const std::string& message) { err << "raidsim: " << message << std::endl; }

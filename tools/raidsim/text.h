@@ -1,6 +1,7 @@
 #pragma once
 
 #include <chrono>
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -11,8 +12,19 @@ namespace raidsim {
 // A 32-bit decimal number that fills the whole text, or nothing.
 [[nodiscard]] std::optional<int> parseInt(std::string_view text) noexcept;
 
+// A decimal number without a sign that fills the whole text, or nothing.
+[[nodiscard]] std::optional<std::uint64_t> parseCount(std::string_view text) noexcept;
+
 // A decimal number of seconds, perhaps with a fraction, up to a million; or nothing.
 [[nodiscard]] std::optional<std::chrono::milliseconds> parseSeconds(std::string_view text) noexcept;
+
+// A time such as 12 or 12.5, without the zeros that tell nothing.
+[[nodiscard]] std::string formatSeconds(std::chrono::milliseconds time);
+
+// UTC, such as 2026-11-21T17:48:00Z; nothing for what is not of this form, or no day of the
+// calendar.
+[[nodiscard]] std::optional<std::chrono::sys_seconds> parseUtc(std::string_view text) noexcept;
+[[nodiscard]] std::string formatUtc(std::chrono::sys_seconds when);
 
 [[nodiscard]] std::string_view trim(std::string_view text) noexcept;
 [[nodiscard]] std::vector<std::string_view> split(std::string_view text, char separator);

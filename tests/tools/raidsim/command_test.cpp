@@ -118,20 +118,26 @@ TEST_F(CommandLine, ReloadOfAMalformedOrMissingFileKeepsTheOldDocument) {
 
 TEST_F(CommandLine, StatusTellsDocumentEventsAndWaits) {
     carryOut("event type=Information");
-    service.events().await(1, [](int) {});
+    service.events().await(1, [](std::optional<int>) {});
     EXPECT_EQ(carryOut("status").message,
               "document served.xml, events 1, newest 1, waiting clients 1");
 }
 
 TEST_F(CommandLine, HelpListsEveryCommandAndQuitQuits) {
     EXPECT_EQ(carryOut("help").message,
-              "event field=value...\n"
+              "event [place=last|first|before:N|after:N] field=value...\n"
               "set PATH field=value...\n"
               "progress PATH PERCENT|done\n"
               "join DRIVE-PATH ARRAY-OR-SPARES-PATH\n"
               "leave DRIVE-PATH ARRAY-OR-SPARES-PATH\n"
+              "add PATH like PATH | from FILE [field=value...]\n"
+              "remove PATH\n"
+              "forget [NUMBER]\n"
               "reload [FILE]\n"
               "fault FILE [CASE] | off\n"
+              "down\n"
+              "up\n"
+              "advance SECONDS\n"
               "status\n"
               "help\n"
               "quit");
@@ -143,7 +149,7 @@ TEST_F(CommandLine, ErrorsAreOneLineThatSaysWhatIsWrong) {
     EXPECT_EQ(errorOf("reboot now"), "unknown command \"reboot\"");
     EXPECT_EQ(errorOf("set adapter:1"), "usage: set PATH field=value...");
     EXPECT_EQ(errorOf("quit now"), "usage: quit");
-    EXPECT_EQ(errorOf("event"), "usage: event field=value...");
+    EXPECT_EQ(errorOf("event"), "usage: event [place=last|first|before:N|after:N] field=value...");
     EXPECT_EQ(errorOf("event color=red"), "event: an event has no field \"color\"");
     EXPECT_EQ(errorOf("event channel=one"), "event: \"one\" is not a number");
     EXPECT_EQ(errorOf("set adapter:1 state"), "set: \"state\" is not of the form field=value");

@@ -3,6 +3,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -90,7 +91,7 @@ TEST(EventLog, WaitForAnEventThatIsThereEndsAtOnceWithTheFirstNewer) {
     EventLog log;
     appendMany(log, 3);
     int got = 0;
-    log.await(1, [&](int number) { got = number; });
+    log.await(1, [&](std::optional<int> number) { got = number.value_or(-1); });
     EXPECT_EQ(got, 2);
     EXPECT_EQ(log.waiting(), 0U);
 }
@@ -98,7 +99,7 @@ TEST(EventLog, WaitForAnEventThatIsThereEndsAtOnceWithTheFirstNewer) {
 TEST(EventLog, WaitEndsWithTheFirstEventAboveTheLastRetrieved) {
     EventLog log;
     int got = 0;
-    log.await(2, [&](int number) { got = number; });
+    log.await(2, [&](std::optional<int> number) { got = number.value_or(-1); });
     appendMany(log, 2);
     EXPECT_EQ(got, 0);
     EXPECT_EQ(log.waiting(), 1U);
@@ -110,7 +111,7 @@ TEST(EventLog, WaitEndsWithTheFirstEventAboveTheLastRetrieved) {
 TEST(EventLog, CancelledWaitIsForgotten) {
     EventLog log;
     bool called = false;
-    const auto ticket = log.await(0, [&](int) { called = true; });
+    const auto ticket = log.await(0, [&](std::optional<int>) { called = true; });
     log.cancel(ticket);
     EXPECT_EQ(log.waiting(), 0U);
     log.append({});
@@ -120,12 +121,111 @@ TEST(EventLog, CancelledWaitIsForgotten) {
 TEST(EventLog, WaiterMayWaitAgain) {
     EventLog log;
     std::vector<int> got;
-    log.await(0, [&](int first) {
-        got.push_back(first);
-        log.await(first, [&](int second) { got.push_back(second); });
+    log.await(0, [&](std::optional<int> first) {
+        got.push_back(first.value());
+        log.await(*first, [&](std::optional<int> second) { got.push_back(second.value()); });
     });
     appendMany(log, 3);
     EXPECT_THAT(got, ElementsAre(1, 2));
+}
+
+TEST(EventLog, LastWaitersAreGivenUpOrWokenAsIfTheNextOneWereThere) {
+    EventLog log;
+    std::vector<std::optional<int>> got;
+    const auto note = [&](std::optional<int> number) { got.push_back(number); };
+    log.await(4, note);
+    log.await(2147483647, note);
+    log.wakeWaiters();
+    EXPECT_THAT(got, ElementsAre(5, 2147483647));
+    log.await(4, note);
+    log.giveWaitersUp();
+    EXPECT_EQ(got.back(), std::nullopt);
+    EXPECT_EQ(log.waiting(), 0U);
+}
+
+// The numbers that a service gets wrong.
+class MisnumberedLog : public testing::Test {
+protected:
+    void insert(int number, EventPlace::Kind kind = EventPlace::Kind::last, int neighbour = 0) {
+        log.insert({{"sequenceNumber", std::to_string(number)}}, {kind, neighbour});
+    }
+    [[nodiscard]] std::vector<int> numbers() const { return numbersIn(log.body(-100, 100)); }
+
+    EventLog log;
+};
+
+TEST_F(MisnumberedLog, ListsEventsAsTheyWereTold) {
+    for (const int number : {5, 5, 9, 7, -1})
+        insert(number);
+    EXPECT_THAT(numbers(), ElementsAre(5, 5, 9, 7, -1));
+    EXPECT_THAT(numbersIn(log.body(5, 7)), ElementsAre(5, 5, 7));
+}
+
+TEST_F(MisnumberedLog, ListsEventsWhereTheyWereTold) {
+    insert(5);
+    insert(6);
+    insert(1, EventPlace::Kind::first);
+    insert(2, EventPlace::Kind::before, 6);
+    insert(3, EventPlace::Kind::after, 6);
+    insert(4, EventPlace::Kind::after, 5);
+    EXPECT_THAT(numbers(), ElementsAre(1, 5, 4, 2, 6, 3));
+    EXPECT_THROW(insert(7, EventPlace::Kind::before, 99), EventError);
+    EXPECT_THROW(insert(7, EventPlace::Kind::after, 99), EventError);
+    EXPECT_EQ(log.size(), 6U);
+}
+
+TEST_F(MisnumberedLog, CountsOnFromTheOneAtTheEnd) {
+    insert(40);
+    insert(2);
+    EXPECT_EQ(log.newest(), 2);
+    EXPECT_EQ(log.append({}), 3);
+}
+
+TEST_F(MisnumberedLog, CountsOnFromAHigherOneElsewhere) {
+    insert(5);
+    insert(3, EventPlace::Kind::first);
+    EXPECT_EQ(log.newest(), 5);
+    insert(8, EventPlace::Kind::first);
+    EXPECT_EQ(log.append({}), 9);
+}
+
+TEST_F(MisnumberedLog, TakesTheNextNumberWhereNoneIsGiven) {
+    insert(5);
+    EXPECT_EQ(log.insert({}, {EventPlace::Kind::first, 0}), 6);
+}
+
+TEST_F(MisnumberedLog, WaitEndsWithTheFirstListedNumberAbove) {
+    insert(40);
+    insert(3);
+    std::vector<int> got;
+    const auto note = [&](std::optional<int> number) { got.push_back(number.value()); };
+    log.await(2, note);
+    log.await(40, note);
+    insert(7);
+    insert(41);
+    EXPECT_THAT(got, ElementsAre(40, 41));
+}
+
+TEST_F(MisnumberedLog, RollsBack) {
+    for (const int number : {1, 2, 9, 3})
+        insert(number);
+    log.rollBack(2);
+    EXPECT_THAT(numbers(), ElementsAre(1, 2));
+    EXPECT_EQ(log.append({}), 3);
+    log.clear();
+    EXPECT_THAT(numbers(), ElementsAre());
+    EXPECT_EQ(log.append({}), 1);
+}
+
+TEST_F(MisnumberedLog, WaitsGoOnWhenTheLogIsForgotten) {
+    insert(1);
+    std::optional<int> got;
+    log.await(1, [&](std::optional<int> number) { got = number; });
+    log.clear();
+    log.append({});
+    EXPECT_EQ(got, std::nullopt);
+    log.append({});
+    EXPECT_EQ(got, 2);
 }
 
 }  // namespace

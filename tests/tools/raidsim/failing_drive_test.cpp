@@ -4,7 +4,7 @@
 #include <string>
 #include <vector>
 
-#include "control/scenario.h"
+#include "control/player.h"
 #include "running_service.h"
 #include "vocabulary.h"
 

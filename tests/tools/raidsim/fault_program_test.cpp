@@ -125,7 +125,7 @@ TEST_F(MisbehavingProgram, RefusesACommandThatNamesNoCase) {
     type("fault cut.fault first");
     EXPECT_EQ(program->readErrorLine(), "raidsim: fault: \"first\" is not the number of a case");
     type("fault gone.fault");
-    EXPECT_EQ(program->readErrorLine(), "raidsim: fault: No such file or directory");
+    EXPECT_EQ(program->readErrorLine(), "raidsim: fault: gone.fault: No such file or directory");
     EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
 }
 

@@ -138,7 +138,7 @@ const std::vector<FailingStart> failingStarts{
     {{"open.xml"}, "raidsim: open.xml: line 1: element \"ac:system\" is not closed\n", 65},
     {{"--scenario", "gone", "system.xml"}, "raidsim: gone: No such file or directory\n", 66},
     {{"--scenario", "bad.script", "system.xml"},
-     "raidsim: bad.script: line 1: a step starts with \"at SECONDS\"\n",
+     "raidsim: bad.script: line 1: unknown statement \"status\"; [^\n]*\n",
      65},
     {{"--init", "bad.script", "system.xml"},
      "raidsim: bad.script: line 2: unknown command \"reboot\"\n",

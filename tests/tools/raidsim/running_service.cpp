@@ -60,9 +60,8 @@ std::string smallSystem() {
 }
 
 Service makeService(const std::string& document, const std::string& path) {
-    return Service(Document::parse(document), path, [] {
-        return std::chrono::system_clock::time_point(std::chrono::seconds(1'000'000'000));
-    });
+    return Service(Document::parse(document), path,
+                   [] { return std::chrono::sys_seconds(std::chrono::seconds(1'000'000'000)); });
 }
 
 RunningService::RunningService(ServerSettings settings, const std::string& document)

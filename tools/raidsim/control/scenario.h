@@ -2,6 +2,7 @@
 
 #include <chrono>
 #include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <optional>
 #include <stdexcept>
@@ -10,6 +11,7 @@
 #include <vector>
 
 #include "control/command.h"
+#include "control/schedule.h"
 
 namespace raidsim {
 
@@ -25,33 +27,26 @@ struct ScriptLine {
     Command command;
 };
 
-// A file of control commands, one a line.
-[[nodiscard]] std::vector<ScriptLine> parseScript(std::string_view text);
+// A file of control commands, one a line. Files are named in it relative to the folder.
+[[nodiscard]] std::vector<ScriptLine> parseScript(std::string_view text,
+                                                  const std::string& folder = {});
 
-struct ScenarioStep {
-    std::chrono::milliseconds at;
-    ScriptLine line;
+// What is carried out once or again and again.
+struct Step {
+    std::size_t line;  // 0: of no file
+    Schedule schedule;
+    std::function<Command(std::uint64_t turn)> commandAt;
 };
 
-// A file of lines `at SECONDS COMMAND` with times that do not decrease.
-[[nodiscard]] std::vector<ScenarioStep> parseScenario(std::string_view text);
-
-// Plays steps as the time it is given passes; keeps no clock of its own.
-class ScenarioPlayer {
-public:
-    using Perform = std::function<void(const ScriptLine&)>;
-
-    explicit ScenarioPlayer(std::vector<ScenarioStep> script) : steps(std::move(script)) {}
-
-    // When the next step is due, counted from the start; nothing at the end.
-    [[nodiscard]] std::optional<std::chrono::milliseconds> nextDue() const;
-
-    // Performs every step that is due at that time and was not performed yet.
-    void advanceTo(std::chrono::milliseconds elapsed, const Perform& perform);
-
-private:
-    std::vector<ScenarioStep> steps;
-    std::size_t next = 0;
+struct Scenario {
+    std::string config;  // the path of the document to begin with; empty: not named
+    std::optional<std::chrono::sys_seconds> start;
+    std::vector<Step> steps;  // in the order in which they are due first
 };
+
+// A file of statements, as docs/scenarios.md describes it. Files are named in it relative to the
+// folder. The seed, when given, is used in place of the file's own. Throws ScriptError.
+[[nodiscard]] Scenario parseScenario(std::string_view text, const std::string& folder = {},
+                                     std::optional<std::uint64_t> seed = {});
 
 }  // namespace raidsim

@@ -19,6 +19,9 @@ public:
 
     // Idempotent; whatever is under way is given up.
     virtual void close() = 0;
+
+    // Closes so that the client meets a reset.
+    virtual void reset() = 0;
 };
 
 }  // namespace raidsim

@@ -22,6 +22,7 @@ public:
 
     void start() override;
     void close() override;
+    void reset() override;
 
 private:
     void next();
@@ -33,7 +34,6 @@ private:
     void whenTaken(void (FaultSession::*then)());
     void shutDown();
     void drain();
-    void reset();
     void stall();
 
     boost::asio::ip::tcp::socket socket;

@@ -25,11 +25,13 @@ Server::Server(boost::asio::io_context& context, Service& served, const ServerSe
       endpoint(boost::asio::ip::address_v4::loopback(), chosen.port) {
     listen();
     service.faults().changed = [this] { listenOrRefuse(); };
+    service.presence().changed = [this] { followPresence(); };
     listenOrRefuse();
 }
 
 Server::~Server() {
     service.faults().changed = [] {};
+    service.presence().changed = [] {};
     stop();
 }
 
@@ -45,16 +47,27 @@ void Server::stop() {
 }
 
 void Server::listen() {
-    acceptor.open(endpoint.protocol());
-    acceptor.set_option(tcp::acceptor::reuse_address(true));
-    acceptor.bind(endpoint);
-    acceptor.listen();
+    tcp::acceptor fresh(acceptor.get_executor(), endpoint.protocol());
+    fresh.set_option(tcp::acceptor::reuse_address(true));
+    fresh.bind(endpoint);
+    fresh.listen();
+    acceptor = std::move(fresh);
     endpoint = acceptor.local_endpoint();
     accept();
 }
 
+void Server::followPresence() {
+    if (service.presence().isDown()) {
+        // Sessions leave the set as they close.
+        const auto open = std::exchange(sessions, {});
+        for (const auto& session : open)
+            session->reset();
+    }
+    listenOrRefuse();
+}
+
 void Server::listenOrRefuse() {
-    const bool refuses = service.faults().refuses();
+    const bool refuses = service.faults().refuses() || service.presence().isDown();
     if (stopped || refuses != acceptor.is_open())
         return;
     if (refuses) {

@@ -45,8 +45,9 @@ private:
     void accept();
     void admit(boost::asio::ip::tcp::socket socket);
     void misbehave(boost::asio::ip::tcp::socket socket, FaultDesk::Play play, std::string body);
-    // While a fault says so, nobody listens.
+    // While a fault says so, or the service is down, nobody listens.
     void listenOrRefuse();
+    void followPresence();
 
     boost::asio::ip::tcp::acceptor acceptor;
     boost::asio::steady_timer pause;

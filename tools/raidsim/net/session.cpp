@@ -45,6 +45,14 @@ void Session::close() {
     onClosed(shared_from_this());
 }
 
+// A client that has its whole answer keeps it, as it does when a process dies.
+void Session::reset() {
+    error_code ignored;
+    if (state != State::draining)
+        socket.set_option(boost::asio::socket_base::linger(true, 0), ignored);
+    close();
+}
+
 // One read is always under way until the client has ended, in every state: it brings the
 // request, tells that a waiting client went away, and takes what the client still sends so that
 // closing does not reset the connection before the answer is read.
@@ -104,18 +112,26 @@ bool Session::handToFault(const http::Request& whole) {
 void Session::handle(const http::Request& whole) {
     if (handToFault(whole))
         return;
-    Service::Reply reply = service.reply(whole);
+    const Service::Reply reply = service.reply(whole);
     if (const auto* const ready = std::get_if<http::Answer>(&reply)) {
         answer(*ready);
+        return;
+    }
+    if (std::holds_alternative<Service::NoAnswer>(reply)) {
+        finish();
         return;
     }
     state = State::waiting;
     timer.cancel();
     const auto awaited = std::get<Service::EventAwaited>(reply);
     ticket = service.events().await(awaited.lastRetrieved,
-                                    [self = shared_from_this()](int sequenceNumber) {
+                                    [self = shared_from_this()](std::optional<int> number) {
                                         self->ticket.reset();
-                                        self->answer(Service::answerToWait(sequenceNumber));
+                                        if (number) {
+                                            self->answer(Service::answerToWait(*number));
+                                        } else {
+                                            self->finish();
+                                        }
                                     });
     if (state != State::waiting)
         ticket.reset();
@@ -132,12 +148,12 @@ void Session::answer(const http::Answer& content) {
                                  if (error) {
                                      self->close();
                                  } else {
-                                     self->answered();
+                                     self->finish();
                                  }
                              });
 }
 
-void Session::answered() {
+void Session::finish() {
     state = State::draining;
     error_code ignored;
     socket.shutdown(tcp::socket::shutdown_send, ignored);

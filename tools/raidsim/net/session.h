@@ -33,6 +33,7 @@ public:
     void refuse(const http::Refusal& refusal);
 
     void close() override;
+    void reset() override;
 
 private:
     enum class State { reading, waiting, answering, draining, closed };
@@ -43,7 +44,8 @@ private:
     void handle(const http::Request& request);
     bool handToFault(const http::Request& request);
     void answer(const http::Answer& answer);
-    void answered();
+    // Nothing more is sent.
+    void finish();
     void limit(std::chrono::milliseconds time);
     void timedOut();
 

@@ -1,6 +1,7 @@
 #include "state/document.h"
 
 #include <array>
+#include <utility>
 
 #include "files.h"
 #include "soap/envelope.h"
@@ -26,30 +27,61 @@ TreeType* systemOf(TreeType& document) {
     return at;
 }
 
-}  // namespace
-
-Document Document::parse(std::string_view text) {
+xml::Tree parseAnswer(std::string_view text) {
     xml::Tree tree = xml::parse(text);
     if (xml::childOf(tree, root) != nullptr)
         tree = soap::envelope(response, tree);
     if (systemOf(tree) == nullptr)
         throw xml::XmlError("there is no ac:system element, bare or in a getConfig answer");
-    return Document(tree);
+    return tree;
+}
+
+}  // namespace
+
+Document Document::parse(std::string_view text) {
+    Document made;
+    made.tree = parseAnswer(text);
+    return made;
 }
 
 Document Document::read(const std::string& path) { return parse(readFile(path)); }
 
+Document Document::verbatim(std::string bytes) {
+    Document made;
+    made.original = std::move(bytes);
+    made.rendered = made.original;
+    return made;
+}
+
 const std::string& Document::body() const {
-    if (rendered.empty())
-        rendered = xml::format(tree);
+    if (rendered.empty() && tree) {
+        // An edit that changed nothing, or was taken back, leaves verbatim bytes as they were.
+        const bool unchanged = !original.empty() && parseAnswer(original) == *tree;
+        rendered = unchanged ? original : xml::format(*tree);
+    }
     return rendered;
 }
 
-const xml::Tree& Document::system() const { return *systemOf(tree); }
+xml::Tree& Document::parsed() const {
+    if (!tree)
+        tree = parseAnswer(original);
+    return *systemOf(*tree);
+}
+
+const xml::Tree& Document::system() const { return parsed(); }
 
 xml::Tree& Document::edit() {
+    xml::Tree& system = parsed();
     rendered.clear();
-    return *systemOf(tree);
+    return system;
+}
+
+std::string Document::systemName() const {
+    try {
+        return xml::textOf(system(), "as:name");
+    } catch (const xml::XmlError&) {
+        return {};
+    }
 }
 
 }  // namespace raidsim

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -14,20 +15,28 @@ public:
     static Document parse(std::string_view text);
     static Document read(const std::string& path);
 
+    // Bytes that are served as they are, well-formed or not, until they are changed.
+    static Document verbatim(std::string bytes);
+
     // The body of the getConfig answer; rendered once after each change.
     [[nodiscard]] const std::string& body() const;
 
+    // Throws XmlError where verbatim bytes are no document.
     [[nodiscard]] const xml::Tree& system() const;
 
-    // For changes: drops the rendered body.
+    // For changes: drops the rendered body. Throws as system does.
     [[nodiscard]] xml::Tree& edit();
 
-    [[nodiscard]] std::string systemName() const { return xml::textOf(system(), "as:name"); }
+    // Empty where there is none.
+    [[nodiscard]] std::string systemName() const;
 
 private:
-    explicit Document(const xml::Tree& wrapped) : tree(wrapped) {}
+    Document() = default;
+    [[nodiscard]] xml::Tree& parsed() const;
 
-    xml::Tree tree;
+    mutable std::optional<xml::Tree>
+        tree;              // verbatim bytes are parsed when somebody looks into them
+    std::string original;  // those bytes
     mutable std::string rendered;
 };
 

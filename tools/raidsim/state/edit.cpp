@@ -4,47 +4,15 @@
 #include <string>
 #include <vector>
 
-#include "text.h"
-
 namespace raidsim {
 
 namespace {
 
-constexpr const char* overallStatus = "as:overallStatus";
 constexpr const char* progress = "ac:progress";
 constexpr const char* channel = "ac:channel";
 constexpr const char* hardDrive = "ac:hardDrive";
 constexpr const char* physicalDrives = "ac:physicalDrives";
 constexpr const char* channelId = "as:channelID";
-
-std::vector<Match> findSome(xml::Tree& system, const Path& path) {
-    auto matches = findAll(system, path);
-    if (matches.empty())
-        throw EditError("the document has no " + path.text());
-    return matches;
-}
-
-Match findOne(xml::Tree& system, const Path& path) {
-    auto matches = findSome(system, path);
-    if (matches.size() > 1)
-        throw EditError(path.text() + " names more than one object");
-    return std::move(matches.front());
-}
-
-void showWorst(xml::Tree& node) {
-    xml::Tree* const own = xml::childOf(node, overallStatus);
-    if (own == nullptr)
-        return;
-    int worst = 0;
-    for (const auto& [name, child] : node)
-        worst = std::max(worst, parseInt(xml::textOf(child, overallStatus)).value_or(0));
-    own->data() = std::to_string(worst);
-}
-
-void showWorstOutwards(const std::vector<xml::Tree*>& outermostFirst) {
-    std::for_each(outermostFirst.rbegin(), outermostFirst.rend(),
-                  [](xml::Tree* node) { showWorst(*node); });
-}
 
 void requireProgress(const Path& path) {
     if (!path.kind().takesProgress)
@@ -80,20 +48,6 @@ void enterChannel(std::vector<xml::Tree*>& way, const xml::Tree& original) {
     way.push_back(listed);
 }
 
-// The drive itself, which stands under a channel of its adapter rather than in an array.
-Match original(xml::Tree& system, const Path& drive) {
-    std::vector<Match> found;
-    for (auto& match : findSome(system, drive)) {
-        const auto& around = match.ancestors;
-        // system / adapter / physicalDrives / channel
-        if (around.size() == 4 && xml::childOf(*around[1], physicalDrives) == around[2])
-            found.push_back(std::move(match));
-    }
-    if (found.size() != 1)
-        throw EditError(drive.text() + " does not name one drive of a channel");
-    return std::move(found.front());
-}
-
 void requireCollection(const Path& drive, const Path& collection) {
     if (drive.kind().name != "drive")
         throw EditError(drive.text() + " is not a drive");
@@ -109,7 +63,7 @@ struct Membership {
 
 Membership membership(xml::Tree& system, const Path& drive, const Path& target) {
     requireCollection(drive, target);
-    Membership found{original(system, drive), {}, {}};
+    Membership found{findAtHome(system, drive), {}, {}};
     Match collection = findOne(system, target);
     found.way = std::move(collection.ancestors);
     if (std::ranges::find(found.way, found.drive.ancestors[1]) == found.way.end())

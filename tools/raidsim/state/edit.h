@@ -1,23 +1,12 @@
 #pragma once
 
-#include <stdexcept>
-#include <string>
-#include <utility>
-#include <vector>
-
 #include "state/document.h"
+#include "state/listings.h"
 #include "state/path.h"
 
 // Changes of the document. Each throws EditError, having changed nothing, when the document has
 // no such object or field.
 namespace raidsim {
-
-class EditError : public std::runtime_error {
-public:
-    using std::runtime_error::runtime_error;
-};
-
-using Fields = std::vector<std::pair<std::string, std::string>>;
 
 // Writes fields (named without "as:") in every listing that has them. A written overallStatus
 // rises: everything around the object then shows the worst overallStatus that it holds, until

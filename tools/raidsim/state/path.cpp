@@ -9,19 +9,21 @@ namespace raidsim {
 
 namespace {
 
+constexpr std::string_view onChannels = "ac:physicalDrives";
+
 constexpr std::array<Kind, 16> kinds{{
     {"system", "ac:system", ""},
     {"adapter", "ac:adapter", "as:adapterID", true},
-    {"channel", "ac:channel", "as:channelID"},
-    {"drive", "ac:hardDrive", "as:deviceID", true},
-    {"enclosure", "ac:enclosure", "as:deviceID"},
-    {"fan", "ac:fan", "as:index"},
-    {"supply", "ac:powerSupply", "as:index"},
-    {"sensor", "ac:tempSensor", "as:index"},
-    {"slot", "ac:deviceSlotID", "as:index"},
+    {"channel", "ac:channel", "as:channelID", false, onChannels, 3},
+    {"drive", "ac:hardDrive", "as:deviceID", true, onChannels, 4, "channel"},
+    {"enclosure", "ac:enclosure", "as:deviceID", false, onChannels, 4, "channel"},
+    {"fan", "ac:fan", "as:index", false, onChannels, 5, "enclosure"},
+    {"supply", "ac:powerSupply", "as:index", false, onChannels, 5, "enclosure"},
+    {"sensor", "ac:tempSensor", "as:index", false, onChannels, 5, "enclosure"},
+    {"slot", "ac:deviceSlotID", "as:index", false, onChannels, 5, "enclosure"},
     {"array", "ac:basicArray", "as:arrayID"},
     {"spanned", "ac:spannedArray", "as:arrayID"},
-    {"logical", "ac:logicalDrive", "as:logicalDriveID", true},
+    {"logical", "ac:logicalDrive", "as:logicalDriveID", true, "ac:logicalDrives", 3, "adapter"},
     {"arrays", "ac:arrays", ""},
     {"logicals", "ac:logicalDrives", ""},
     {"physicals", "ac:physicalDrives", ""},
@@ -110,6 +112,12 @@ Path Path::parse(std::string_view text) {
     for (const std::string_view step : split(text, '/'))
         path.list.push_back(parseStep(step));
     return path;
+}
+
+std::optional<Path> Path::parent() const {
+    if (list.size() == 1)
+        return std::nullopt;
+    return parse(std::string_view(written).substr(0, written.rfind('/')));
 }
 
 std::vector<Match> findAll(xml::Tree& system, const Path& path) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <cstddef>
+#include <optional>
 #include <stdexcept>
 #include <string>
 #include <string_view>
@@ -15,6 +17,13 @@ struct Kind {
     std::string_view element;
     std::string_view idField;  // empty for the collections, which need no number
     bool takesProgress = false;
+    // Things may be listed in several places. They are at home in this collection of their adapter,
+    // so many levels below the system; no collection: there is only one listing.
+    std::string_view home{};
+    std::size_t depth = 0;
+    // The kind of the things that it is put into and taken out of while the system runs; empty for
+    // what stays.
+    std::string_view plugsInto{};
 };
 
 class PathError : public std::runtime_error {
@@ -37,6 +46,10 @@ public:
     [[nodiscard]] const std::string& text() const noexcept { return written; }
     [[nodiscard]] const std::vector<Step>& steps() const noexcept { return list; }
     [[nodiscard]] const Kind& kind() const noexcept { return *list.back().kind; }
+    [[nodiscard]] const std::string& id() const noexcept { return list.back().id; }
+
+    // The path without its last step; nothing when that is the only one.
+    [[nodiscard]] std::optional<Path> parent() const;
 
 private:
     std::string written;

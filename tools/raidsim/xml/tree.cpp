@@ -48,10 +48,16 @@ public:
     explicit Writer(Layout wanted) : layout(wanted) {}
 
     std::string write(const Tree& document) {
+        out = "<?xml version=\"1.0\" encoding=\"utf-8\"?>";
         endLine();
         for (const auto& [name, child] : document)
             append(name, child, 0);
         return std::move(out);
+    }
+
+    std::string writeElement(const std::string& name, const Tree& element, std::size_t depth) {
+        append(name, element, depth);
+        return out.substr(2 * depth, out.size() - 2 * depth - 1);
     }
 
 private:
@@ -87,7 +93,7 @@ private:
     }
 
     Layout layout;
-    std::string out = "<?xml version=\"1.0\" encoding=\"utf-8\"?>";
+    std::string out;
 };
 
 // The blanks between the children of an element arrive as its text.
@@ -115,6 +121,10 @@ Tree parse(std::string_view text) {
 }
 
 std::string format(const Tree& document, Layout layout) { return Writer(layout).write(document); }
+
+std::string formatElement(const std::string& name, const Tree& element, std::size_t depth) {
+    return Writer(Layout::indented).writeElement(name, element, depth);
+}
 
 Tree element(const std::string& xsiType) {
     Tree made;

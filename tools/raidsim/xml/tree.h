@@ -31,6 +31,11 @@ enum class Layout {
 // element is written as a start tag and an end tag.
 [[nodiscard]] std::string format(const Tree& document, Layout layout = Layout::indented);
 
+// Writes one element as it stands that many levels deep in an indented document, from its first "<"
+// to its last ">".
+[[nodiscard]] std::string formatElement(const std::string& name, const Tree& element,
+                                        std::size_t depth);
+
 [[nodiscard]] Tree element(const std::string& xsiType);
 void addAttribute(Tree& element, const std::string& name, const std::string& value);
 Tree& addChild(Tree& parent, const std::string& name, const Tree& child = {});

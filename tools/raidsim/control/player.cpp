@@ -1,0 +1,37 @@
+#include "control/player.h"
+
+#include <algorithm>
+#include <utility>
+
+namespace raidsim {
+
+ScenarioPlayer::ScenarioPlayer(std::vector<Step> steps) : list(std::move(steps)) {
+    for (std::size_t step = 0; step < list.size(); ++step)
+        next.push(dueOf(step, 0));
+}
+
+ScenarioPlayer::Due ScenarioPlayer::dueOf(std::size_t step, std::uint64_t turn) const {
+    return {list[step].schedule.due(turn), step, turn};
+}
+
+std::optional<ScenarioPlayer::Time> ScenarioPlayer::nextDue() const {
+    if (next.empty())
+        return std::nullopt;
+    return next.top().at;
+}
+
+void ScenarioPlayer::advanceTo(Time elapsed, const Perform& perform) {
+    while (!next.empty() && next.top().at <= elapsed) {
+        const Due due = next.top();
+        next.pop();
+        const Step& step = list[due.step];
+        if (due.turn + 1 < step.schedule.turns)
+            next.push(dueOf(due.step, due.turn + 1));
+        now = std::max(now, due.at);
+        // Made only when it is performed, so that what is wrong with it is an error of performing.
+        perform({step.line, [&](Service& service) { return step.commandAt(due.turn)(service); }});
+    }
+    now = std::max(now, elapsed);
+}
+
+}  // namespace raidsim

@@ -1,0 +1,51 @@
+#pragma once
+
+#include <chrono>
+#include <compare>
+#include <cstddef>
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <queue>
+#include <vector>
+
+#include "control/scenario.h"
+
+namespace raidsim {
+
+// Plays steps as the time it is given passes; keeps no clock of its own.
+class ScenarioPlayer {
+public:
+    using Time = std::chrono::milliseconds;
+    using Perform = std::function<void(const ScriptLine&)>;
+
+    explicit ScenarioPlayer(std::vector<Step> steps);
+    explicit ScenarioPlayer(Scenario scenario) : ScenarioPlayer(std::move(scenario.steps)) {}
+
+    // When the next step is due, counted from the start; nothing at the end.
+    [[nodiscard]] std::optional<Time> nextDue() const;
+
+    // Performs every step that is due at that time and was not performed yet: by time, and at one
+    // time in the order of the steps.
+    void advanceTo(Time elapsed, const Perform& perform);
+
+    // What the clock shows: while a step is performed, when it was due.
+    [[nodiscard]] Time elapsed() const noexcept { return now; }
+
+private:
+    struct Due {
+        Time at;
+        std::size_t step;
+        std::uint64_t turn;
+
+        auto operator<=>(const Due&) const = default;
+    };
+
+    [[nodiscard]] Due dueOf(std::size_t step, std::uint64_t turn) const;
+
+    std::vector<Step> list;
+    std::priority_queue<Due, std::vector<Due>, std::greater<>> next;  // one turn of each step
+    Time now{0};
+};
+
+}  // namespace raidsim
