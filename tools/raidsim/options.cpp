@@ -69,6 +69,21 @@ void addContent(CLI::App& app, Options& options) {
     app.add_option("--fault", options.fault, "Fault file whose cases the clients meet in turn");
 }
 
+// An option whose text is read by parse, which gives nothing for one that is wrong.
+template <typename Value>
+void addParsed(CLI::App& app, const std::string& name, const char* meaning,
+               std::optional<Value>& target, std::optional<Value> (*parse)(std::string_view),
+               const char* wrong) {
+    app.add_option_function<std::string>(
+        name,
+        [=, &target](const std::string& text) {
+            target = parse(text);
+            if (!target)
+                throw CLI::ValidationError(name, text + " is " + wrong);
+        },
+        meaning);
+}
+
 void addTime(CLI::App& app, Options& options) {
     app.add_option_function<std::string>(
            "--clock",
@@ -78,19 +93,13 @@ void addTime(CLI::App& app, Options& options) {
            "What moves the time of scenario and recording: \"real\" (the default), or \"virtual\": "
            "only the command \"advance\"")
         ->check(CLI::IsMember({"real", "virtual"}));
-    app.add_option_function<std::string>(
-        "--epoch",
-        [&options](const std::string& text) {
-            options.epoch = parseUtc(text);
-            if (!options.epoch)
-                throw CLI::ValidationError("--epoch",
-                                           text + " is no time such as 2026-11-21T17:48:00Z");
-        },
-        "Date (UTC) at which the virtual clock begins");
+    addParsed(app, "--epoch", "Date (UTC) at which the virtual clock begins", options.epoch,
+              parseUtc, "no time such as 2026-11-21T17:48:00Z");
     app.add_option("--speed", options.speed, "How much faster the real clock's time passes")
         ->check(CLI::Range(0.001, 1e6))
         ->capture_default_str();
-    app.add_option("--seed", options.seed, "Seed of the scenario's choices in place of its own");
+    addParsed(app, "--seed", "Seed of the scenario's choices in place of its own", options.seed,
+              parseCount, "no number from 0 to 18446744073709551615");
 }
 
 void checkTogether(const CLI::App& app, const Options& options) {

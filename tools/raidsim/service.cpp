@@ -127,7 +127,7 @@ void Service::substitute(RequestKind kind, std::optional<std::string> body) {
     substitutes.insert_or_assign(kind, std::move(body));
 }
 
-EventLog::Fields Service::completed(EventLog::Fields fields) const {
+int Service::addEvent(EventLog::Fields fields, const std::optional<EventPlace>& place) {
     const std::array<std::pair<const char*, std::string>, 3> defaults{{
         {"date", formatUtc(clock())},
         {"serverName", served.systemName()},
@@ -135,7 +135,9 @@ EventLog::Fields Service::completed(EventLog::Fields fields) const {
     }};
     // In front, so that a given value overrides.
     fields.insert(fields.begin(), defaults.begin(), defaults.end());
-    return fields;
+    const int number = place ? log.insert(fields, *place) : log.append(fields);
+    answerFromState(RequestKind::newest);
+    return number;
 }
 
 }  // namespace raidsim

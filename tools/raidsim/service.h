@@ -5,7 +5,6 @@
 #include <map>
 #include <optional>
 #include <string>
-#include <utility>
 #include <variant>
 
 #include "fault/desk.h"
@@ -54,10 +53,9 @@ public:
     void substitute(RequestKind kind, std::optional<std::string> body);
     void answerFromState(RequestKind kind) { substitutes.erase(kind); }
 
-    // The fields of an event with the date, serverName and serverAddress filled in where they are
-    // not given.
-    [[nodiscard]] EventLog::Fields completed(EventLog::Fields fields) const;
-    int addEvent(EventLog::Fields fields) { return log.append(completed(std::move(fields))); }
+    // Adds an event, at the end and with a number that rises unless a place is given; date, serverName
+    // and serverAddress are filled in when they are not given.
+    int addEvent(EventLog::Fields fields, const std::optional<EventPlace>& place = {});
 
     [[nodiscard]] Document& document() noexcept { return served; }
     [[nodiscard]] EventLog& events() noexcept { return log; }

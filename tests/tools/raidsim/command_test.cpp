@@ -89,6 +89,75 @@ TEST_F(CommandLine, SetProgressJoinAndLeaveChangeTheDocument) {
     EXPECT_NE(service.document().body(), before);  // the whole drive is listed now
 }
 
+TEST_F(CommandLine, EventWithAPlaceMayHaveAnyNumber) {
+    carryOut("event sequenceNumber=5");
+    carryOut("event place=last sequenceNumber=5 string=again");
+    carryOut("event sequenceNumber=3 place=first");
+    carryOut("event place=before:5 sequenceNumber=4");
+    carryOut("event place=after:3");
+    EXPECT_EQ(service.events().size(), 5U);
+    EXPECT_EQ(service.events().newest(), 6);
+    EXPECT_EQ(errorOf("event sequenceNumber=6"),
+              "event: sequenceNumber 6 is not above the newest, 6");
+    EXPECT_EQ(errorOf("event place=before:9 type=x"), "event: there is no event 9");
+    for (const std::string wrong : {"", "end", "last:1", "before", "before:", "after:x", ":1"}) {
+        EXPECT_EQ(
+            errorOf("event place=" + wrong),
+            "event: \"" + wrong + "\" is no place: last, first, before:NUMBER or after:NUMBER");
+    }
+}
+
+TEST_F(CommandLine, ForgetLosesAllEventsOrTheLast) {
+    for (int i = 0; i < 5; ++i)
+        carryOut("event type=Information");
+    EXPECT_EQ(errorOf("forget 6"), "forget: the newest event is 5");
+    EXPECT_EQ(errorOf("forget -1"), "forget: \"-1\" is not the number of an event");
+    EXPECT_EQ(errorOf("forget all"), "forget: \"all\" is not the number of an event");
+    carryOut("forget 3");
+    EXPECT_EQ(service.events().newest(), 3);
+    carryOut("forget");
+    EXPECT_EQ(service.events().newest(), 0);
+    EXPECT_EQ(service.events().size(), 0U);
+}
+
+TEST_F(CommandLine, AddAndRemovePlugDrives) {
+    const std::string before = service.document().body();
+    carryOut("add adapter:1/channel:1/drive:4 like channel:2/drive:0 state=0 \"model=R 5\"");
+    EXPECT_THAT(service.document().body(), HasSubstr("<as:model>R 5</as:model>"));
+    carryOut("remove channel:1/drive:4");
+    EXPECT_EQ(service.document().body(), before);
+    writeFile("drive.xml", "<ac:hardDrive><as:deviceID/></ac:hardDrive>");
+    carryOut("add channel:1/drive:4 from drive.xml deviceID=04");
+    EXPECT_THAT(service.document().body(), HasSubstr("<as:deviceID>04</as:deviceID>"));
+}
+
+TEST_F(CommandLine, AddSaysWhatIsWrongWithItsModel) {
+    EXPECT_EQ(errorOf("add channel:1/drive:4 as drive:0"),
+              "add: \"as\" is neither \"like\" nor \"from\"");
+    EXPECT_EQ(errorOf("add channel:1/drive:4 from gone.xml"),
+              "add: gone.xml: No such file or directory");
+    writeFile("fan.xml", "<ac:fan/>");
+    EXPECT_EQ(errorOf("add channel:1/drive:4 from fan.xml"),
+              "add: fan.xml: the file holds \"ac:fan\" in place of \"ac:hardDrive\"");
+    EXPECT_EQ(errorOf("add channel:1/drive:4 like drive:0 state"),
+              "add: \"state\" is not of the form field=value");
+}
+
+TEST_F(CommandLine, DownAndUpAreToldByStatus) {
+    carryOut("down");
+    EXPECT_EQ(carryOut("status").message,
+              "document served.xml, events 0, newest 0, waiting clients 0, down");
+    carryOut("up");
+    EXPECT_EQ(carryOut("status").message,
+              "document served.xml, events 0, newest 0, waiting clients 0");
+}
+
+TEST_F(CommandLine, AdvanceIsForWhoKeepsTheClock) {
+    EXPECT_EQ(carryOut("advance 2.5").advance, std::chrono::milliseconds(2500));
+    EXPECT_EQ(carryOut("status").advance, std::nullopt);
+    EXPECT_EQ(errorOf("advance soon"), "advance: \"soon\" is not a time in seconds");
+}
+
 TEST_F(CommandLine, ReloadServesTheFileAsItIsNow) {
     writeFile("served.xml", "<ac:system><as:name>oak</as:name></ac:system>");
     EXPECT_EQ(carryOut("reload").message, "serving served.xml");

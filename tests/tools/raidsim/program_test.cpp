@@ -140,6 +140,26 @@ const std::vector<FailingStart> failingStarts{
     {{"--scenario", "bad.script", "system.xml"},
      "raidsim: bad.script: line 1: unknown statement \"status\"; [^\n]*\n",
      65},
+    {{"--scenario", "no-config.scenario"},
+     "raidsim: no-config.scenario names no configuration, so CONFIG is required\n",
+     64},
+    {{"--scenario", "gone-config.scenario"}, "raidsim: gone.xml: No such file or directory\n", 66},
+    {{"--replay", "gone.rec"}, "raidsim: gone.rec: No such file or directory\n", 66},
+    {{"--replay", "system.xml"},
+     "raidsim: system.xml: byte 0: a recording begins with a line such as [^\n]*\n",
+     65},
+    {{"--replay", "day.rec", "system.xml"}, "raidsim: [^\n]*--replay[^\n]*\n", 64},
+    {{"--clock", "slow", "system.xml"}, "raidsim: --clock: [^\n]*\n", 64},
+    {{"--epoch", "2026-01-01T00:00:00Z", "system.xml"},
+     "raidsim: --epoch needs --clock virtual\n",
+     64},
+    {{"--clock", "virtual", "--epoch", "soon", "system.xml"},
+     "raidsim: --epoch: soon is no time such as 2026-11-21T17:48:00Z\n",
+     64},
+    {{"--clock", "virtual", "--speed", "1", "system.xml"},
+     "raidsim: --speed needs --clock real\n",
+     64},
+    {{"--seed", "-1", "system.xml"}, "raidsim: --seed: -1 is no number [^\n]*\n", 64},
     {{"--init", "bad.script", "system.xml"},
      "raidsim: bad.script: line 2: unknown command \"reboot\"\n",
      65},
@@ -158,6 +178,9 @@ TEST(Program, FailsToStartWithOneLineAndAStatus) {
     writeFile("open.xml", "<ac:system>");
     writeFile("bad.script", "status\nreboot\n");
     writeFile("bad.fault", "title \"Bad\"\nexplode\n");
+    writeFile("no-config.scenario", "at 1 status\n");
+    writeFile("gone-config.scenario", "config gone.xml\n");
+    writeFile("day.rec", "raid-recording 1 2026-11-21T17:48:00Z\n");
     writeFile("failing.init", "set adapter:9 state=4\n");
     for (const auto& [arguments, message, status] : failingStarts) {
         Program program(arguments);
@@ -175,7 +198,9 @@ TEST(Program, WritesAGeneratedDocumentAndEnds) {
 TEST(Program, HelpNamesEveryOption) {
     Program program({"--help"});
     const std::string help = program.readOutput();
-    for (const char* const option : {"CONFIG", "--init", "--scenario", "--speed", "--port"})
+    for (const char* const option :
+         {"CONFIG", "--replay", "--init", "--scenario", "--fault", "--clock", "--epoch", "--speed",
+          "--seed", "--port", "generate", "Examples:", "Exit status:"})
         EXPECT_THAT(help, HasSubstr(option));
     EXPECT_EQ(program.exitStatus(), 0);
 }

@@ -73,11 +73,20 @@ RunningService::RunningService(ServerSettings settings, const std::string& docum
 
 RunningService::~RunningService() {
     onService([this] { server->stop(); });
+    work.reset();
     thread.join();
 }
 
 void RunningService::command(std::string_view line) {
     onService([&] { run(line, service); });
+}
+
+void RunningService::silence(RequestKind kind) {
+    onService([&] { service.substitute(kind, std::nullopt); });
+}
+
+void RunningService::giveWaitersUp() {
+    onService([this] { service.events().giveWaitersUp(); });
 }
 
 std::size_t RunningService::waiting() {

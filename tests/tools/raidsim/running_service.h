@@ -1,5 +1,6 @@
 #pragma once
 
+#include <boost/asio/executor_work_guard.hpp>
 #include <boost/asio/io_context.hpp>
 #include <boost/asio/post.hpp>
 #include <future>
@@ -32,6 +33,8 @@ public:
 
     // Runs on the service's thread.
     void command(std::string_view line);
+    void silence(RequestKind kind);
+    void giveWaitersUp();
     [[nodiscard]] std::size_t waiting();
     [[nodiscard]] std::size_t clients();
 
@@ -48,6 +51,9 @@ private:
     }
 
     boost::asio::io_context context{1};
+    // Without it the thread would end when nobody listens.
+    std::optional<boost::asio::executor_work_guard<boost::asio::io_context::executor_type>> work{
+        context.get_executor()};
     Service service;
     std::optional<Server> server;
     std::uint16_t listening;

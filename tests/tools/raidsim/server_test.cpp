@@ -5,17 +5,22 @@
 
 #include <boost/system/system_error.hpp>
 #include <memory>
+#include <optional>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include "bounds.h"
 #include "client.h"
+#include "control/command.h"
 #include "running_service.h"
+#include "support/files.h"
 
 namespace raidsim::test {
 namespace {
 
 using namespace std::chrono_literals;
+using testing::EndsWith;
 using testing::HasSubstr;
 using testing::StartsWith;
 
@@ -200,6 +205,81 @@ TEST(Server, StoppingDropsThoseWhoWait) {
     service->awaitWaiting(1);
     service.reset();
     EXPECT_EQ(client.receive(), "");
+}
+
+TEST(Server, IsNotThereWhileItIsDownAndForgetsNothing) {
+    RunningService service;
+    service.command("event type=Information");
+    service.command("down");
+    EXPECT_THROW(Client{service.port()}, boost::system::system_error);
+    service.command("up");
+    EXPECT_THAT(ask(service.port(), getNewestEvent()), HasSubstr(">1</as:return>"));
+}
+
+TEST(Server, ResetsEveryConnectionWhenItGoesDown) {
+    RunningService service;
+    Client waiting(service.port());
+    waiting.send(waitNextEvent(0));
+    service.awaitWaiting(1);
+    Client silent(service.port());
+    service.awaitClients(2);
+    service.command("down");
+    for (Client* const client : {&waiting, &silent}) {
+        try {
+            (void)client->receive();
+            FAIL() << "the connection ended in good order";
+        } catch (const boost::system::system_error& error) {
+            EXPECT_EQ(error.code(), boost::asio::error::connection_reset);
+        }
+    }
+    EXPECT_EQ(service.clients(), 0U);
+    EXPECT_EQ(service.waiting(), 0U);
+}
+
+TEST(Server, LeavesAnAnswerToWhoHasItWhenItGoesDown) {
+    RunningService service;
+    Client client(service.port());
+    client.send(getConfig);
+    while (!client.isAnswered())
+        std::this_thread::yield();
+    service.command("down");
+    EXPECT_THAT(client.receive(), EndsWith("</env:Envelope>\n"));
+}
+
+TEST(Server, StaysDownWhenItCannotListen) {
+    RunningService service;
+    service.command("down");
+    ServerSettings settings;
+    settings.port = service.port();
+    boost::asio::io_context context;
+    Service other = makeService(smallSystem());
+    std::optional<Server> inTheWay(std::in_place, context, other, settings);
+    EXPECT_THROW(service.command("up"), CommandError);
+    inTheWay.reset();
+    service.command("up");
+    EXPECT_THAT(ask(service.port(), getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+}
+
+TEST(Server, IsDownAndUpWhileAFaultRefusesConnections) {
+    raid::test::writeFile("refuse.fault", "title \"Is not there\"\nrefuse\n");
+    RunningService service;
+    service.command("fault refuse.fault");
+    service.command("down");
+    service.command("fault off");
+    EXPECT_THROW(Client{service.port()}, boost::system::system_error);
+    service.command("up");
+    EXPECT_THAT(ask(service.port(), getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+}
+
+TEST(Server, ClosesInGoodOrderWhereNothingIsAnswered) {
+    RunningService service;
+    service.silence(RequestKind::config);
+    EXPECT_EQ(ask(service.port(), getConfig), "");
+    Client waiting(service.port());
+    waiting.send(waitNextEvent(0));
+    service.awaitWaiting(1);
+    service.giveWaitersUp();
+    EXPECT_EQ(waiting.receive(), "");
 }
 
 TEST(Server, PortInUseIsAnError) {

@@ -51,11 +51,7 @@ Command event(const Arguments& arguments) {
     }
     EventLog::check(fields);
     return [fields = std::move(fields), place](Service& service) {
-        if (place) {
-            service.events().insert(service.completed(fields), *place);
-        } else {
-            service.addEvent(fields);
-        }
+        service.addEvent(fields, place);
         return Outcome{};
     };
 }
@@ -64,6 +60,7 @@ Command forget(const Arguments& arguments) {
     if (arguments.words.empty()) {
         return [](Service& service) {
             service.events().clear();
+            service.answerFromState(RequestKind::newest);
             return Outcome{};
         };
     }
@@ -75,6 +72,7 @@ Command forget(const Arguments& arguments) {
         if (newest > log.newest())
             throw CommandError("the newest event is " + std::to_string(log.newest()));
         log.rollBack(newest);
+        service.answerFromState(RequestKind::newest);
         return Outcome{};
     };
 }
