@@ -203,11 +203,10 @@ std::string written(const Entry& entry) {
     std::string line(kinds.at(static_cast<std::size_t>(kind)));
     line.append(" ").append(std::to_string(entry.at.count())).append(" ");
     line.append(questions.at(static_cast<std::size_t>(entry.question)));
-    if (entry.body)
-        line.append(" ")
-            .append(std::to_string(entry.body->size()))
-            .append("\n")
-            .append(*entry.body);
+    if (entry.body) {
+        line.append(" ").append(std::to_string(entry.body->size()));
+        line.append("\n").append(*entry.body);
+    }
     return line.append("\n");
 }
 
