@@ -1,12 +1,13 @@
 #pragma once
 
 #include <chrono>
-#include <compare>
 #include <cstddef>
 #include <cstdint>
 #include <functional>
 #include <optional>
 #include <queue>
+#include <tuple>
+#include <utility>
 #include <vector>
 
 #include "control/scenario.h"
@@ -38,7 +39,10 @@ private:
         std::size_t step;
         std::uint64_t turn;
 
-        auto operator<=>(const Due&) const = default;
+        friend bool operator>(const Due& left, const Due& right) {
+            return std::tie(left.at, left.step, left.turn) >
+                   std::tie(right.at, right.step, right.turn);
+        }
     };
 
     [[nodiscard]] Due dueOf(std::size_t step, std::uint64_t turn) const;

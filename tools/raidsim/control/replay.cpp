@@ -17,7 +17,6 @@ namespace raidsim {
 
 namespace {
 
-using recording::Entry;
 using recording::Question;
 using recording::Recording;
 using Body = std::optional<std::string>;
@@ -79,19 +78,19 @@ constexpr std::array<Replay, 3> replays{{
     {Question::events, replayEvents},
 }};
 
-void replay(Service& service, const Entry& entry) {
+void replay(Service& service, const recording::Entry& entry) {
     std::ranges::find(replays, entry.question, &Replay::question)->perform(service, entry.body);
 }
 
-const Entry* firstOf(const Recording& recording, Question question) {
-    const auto found = std::ranges::find(recording.entries, question, &Entry::question);
+const recording::Entry* firstOf(const Recording& recording, Question question) {
+    const auto found = std::ranges::find(recording.entries, question, &recording::Entry::question);
     return found == recording.entries.end() ? nullptr : &*found;
 }
 
 void beginReplay(Service& service, const Recording& recording) {
-    const Entry* const configuration = firstOf(recording, Question::configuration);
+    const recording::Entry* const configuration = firstOf(recording, Question::configuration);
     replayConfiguration(service, configuration == nullptr ? std::nullopt : configuration->body);
-    if (const Entry* const newest = firstOf(recording, Question::newestEvent))
+    if (const recording::Entry* const newest = firstOf(recording, Question::newestEvent))
         replay(service, *newest);
 }
 
@@ -102,12 +101,12 @@ Step stepAt(std::chrono::milliseconds time, Command command) {
 
 }  // namespace
 
-std::vector<Step> replayOf(std::shared_ptr<const Recording> recording) {
+std::vector<Step> replayOf(const std::shared_ptr<const Recording>& recording) {
     std::vector<Step> steps{stepAt(std::chrono::milliseconds(0), [recording](Service& service) {
         beginReplay(service, *recording);
         return Outcome{};
     })};
-    for (const Entry& entry : recording->entries) {
+    for (const recording::Entry& entry : recording->entries) {
         // The recording lives as long as its steps.
         steps.push_back(stepAt(entry.at, [recording, &entry](Service& service) {
             replay(service, entry);

@@ -12,6 +12,7 @@ namespace raidsim {
 // of its recording on, the first configuration and the first newest event from the beginning on,
 // and nothing where the exchange failed. A question that was not recorded at all is answered from
 // the events, and for the configuration with nothing.
-[[nodiscard]] std::vector<Step> replayOf(std::shared_ptr<const recording::Recording> recording);
+[[nodiscard]] std::vector<Step> replayOf(
+    const std::shared_ptr<const recording::Recording>& recording);
 
 }  // namespace raidsim

@@ -22,7 +22,7 @@ bool isReserved(std::string_view name) {
     return name == percentName || name == countName || name == indexName;
 }
 
-bool isName(std::string_view word) {
+bool mayBeName(std::string_view word) {
     const auto letter = [](char c) { return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z'); };
     return !word.empty() && letter(word.front()) && std::ranges::all_of(word, [&](char c) {
         return letter(c) || (c >= '0' && c <= '9') || c == '-';
@@ -56,7 +56,7 @@ void forEachPart(std::string_view line, Text text, Held held) {
 }  // namespace
 
 void Names::define(const std::string& name, const std::string& value) {
-    if (!isName(name) || isReserved(name))
+    if (!mayBeName(name) || isReserved(name))
         throw CommandError("\"" + name + "\" cannot be a name");
     if (!values.emplace(name, value).second)
         throw CommandError("\"" + name + "\" has a meaning already");
@@ -70,7 +70,7 @@ std::string Names::replacedIn(std::string_view line) const {
             const auto found = values.find(held);
             if (found != values.end()) {
                 replaced.append(found->second);
-            } else if (isName(held) && !isReserved(held)) {
+            } else if (mayBeName(held) && !isReserved(held)) {
                 throw CommandError("nothing is called {" + std::string(held) + "}");
             } else {
                 replaced.append("{").append(held).append("}");

@@ -187,7 +187,7 @@ EventLog::Entries::const_iterator EventLog::positionOf(const EventPlace& place) 
     return place.kind == EventPlace::Kind::before ? neighbour : neighbour + 1;
 }
 
-int EventLog::add(Entries::const_iterator position, Entry entry) {
+int EventLog::add(const Entries::const_iterator& position, Entry entry) {
     const int number = entry.event.sequenceNumber;
     frame = entry.frame;
     last = position == events.end() ? number : std::max(last, number);

@@ -97,7 +97,7 @@ private:
     static const Frame& ownFrame();
     [[nodiscard]] static Entry made(const Fields& fields, int sequenceNumber);
     [[nodiscard]] Entries::const_iterator positionOf(const EventPlace& place) const;
-    int add(Entries::const_iterator position, Entry entry);
+    int add(const Entries::const_iterator& position, Entry entry);
     void release(int sequenceNumber);
 
     std::size_t capacity;

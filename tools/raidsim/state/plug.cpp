@@ -78,9 +78,10 @@ bool isTaken(xml::Tree& system, const Path& path, const Way& owner) {
 void overwrite(xml::Tree& thing, const std::string& field, const std::string& value,
                const Path& path) {
     xml::Tree* const child = xml::childOf(thing, field);
-    if (child == nullptr)
+    if (child == nullptr) {
         throw EditError(path.text() + " has no field \"" + field.substr(field.find(':') + 1) +
                         "\"");
+    }
     child->data() = value;
 }
 
