@@ -53,8 +53,8 @@ public:
     void substitute(RequestKind kind, std::optional<std::string> body);
     void answerFromState(RequestKind kind) { substitutes.erase(kind); }
 
-    // Adds an event, at the end and with a number that rises unless a place is given; date, serverName
-    // and serverAddress are filled in when they are not given.
+    // Adds an event, at the end and with a number that rises unless a place is given; date,
+    // serverName and serverAddress are filled in when they are not given.
     int addEvent(EventLog::Fields fields, const std::optional<EventPlace>& place = {});
 
     [[nodiscard]] Document& document() noexcept { return served; }
