@@ -1,0 +1,115 @@
+"""The entrance to the package."""
+
+import os
+import weakref
+from types import TracebackType
+from typing import TypeVar
+
+from .calls import Call
+from .configuration import read_inventory
+from .errors import ServiceUnavailable
+from .events import LARGEST_NUMBER, EventStream, check_newest
+from .inventory import Inventory
+from .library import load
+
+Result = TypeVar("Result")
+
+# As long as raidinfo waits.
+PATIENCE = 60.0
+
+
+class RAIDInstrumentation:
+    """The RAID configuration and events of this machine.
+
+        with RAIDInstrumentation() as raid:
+            for drive in raid.inventory().disk_drives:
+                print(drive.serial_number, drive.overall_status)
+
+    Threads: all methods may be called from any thread. Inventory calls wait for each other; one
+    stream of events can be waited for beside them. What is returned never changes and may be
+    shared. This holds for all objects of this class together, since the library's state is the
+    process's; it does not hold for other code of the process that calls the library by itself.
+
+    Signals: the library is called on threads of its own, so that Ctrl-C works while the service is
+    waited for. They get none of the host's signals. To wake them, SIGURG is given a handler that
+    does nothing, unless it has a handler already. A process that forks must not use the parent's
+    objects in the child.
+
+    Output: the library prints one line for each exchange with the service on standard output; see
+    discarded_c_output. Memory that runs out inside the library ends the process.
+    """
+
+    def __init__(self, library: str | os.PathLike[str] | None = None) -> None:
+        """Loads the library: this file, else the one that the environment variable
+        RAIDINSTRUMENTATION_LIBRARY names, else libRAIDInstrumentation.so.1 as the loader finds it.
+
+        Asks the service nothing. Raises LibraryNotFound, or LibraryUnusable.
+        """
+        self._library = load(library)
+        self._inventory: Inventory | None = None
+        self._streams: weakref.WeakSet[EventStream] = weakref.WeakSet()
+        self._is_closed = False
+
+    def __enter__(self) -> "RAIDInstrumentation":
+        return self
+
+    def __exit__(
+        self,
+        kind: type[BaseException] | None,
+        error: BaseException | None,
+        traceback: TracebackType | None,
+    ) -> None:
+        self.close()
+
+    def close(self) -> None:
+        """Cancels the event streams. Afterwards nothing can be asked any more."""
+        self._is_closed = True
+        for stream in tuple(self._streams):
+            stream.cancel()
+
+    def inventory(self, *, timeout: float | None = PATIENCE) -> Inventory:
+        """The inventory that was read last; reads it if there is none yet, as refresh does."""
+        return self._inventory or self.refresh(timeout=timeout)
+
+    def refresh(self, *, timeout: float | None = PATIENCE) -> Inventory:
+        """Asks the service for the inventory, which inventory() then returns, too.
+
+        Raises ServiceUnavailable, also after so many seconds without an answer (None waits without
+        limit), or MalformedAnswer; inventory() then returns what it did before.
+        """
+        library = self._library
+        call = Call(lambda stopping: read_inventory(library, stopping), library.cancel)
+        self._inventory = self._result(call, timeout)
+        return self._inventory
+
+    def events(self, since: int | None = None, *, timeout: float | None = PATIENCE) -> EventStream:
+        """The events that come after the one with the number since, or from the newest one on.
+
+        0 is before the first event that the service keeps. To resume later, store the
+        sequence_number of the last event that was dealt with.
+
+        Asks the service for its newest event, so that none is missed between this call and the
+        first next(). Raises ServiceUnavailable as refresh does, and EventLogRestarted if that event
+        is older than since. The timeout is that of this call, not of the stream.
+        """
+        if since is not None and not 0 <= since <= LARGEST_NUMBER:
+            raise ValueError(f"event numbers range from 0 to {LARGEST_NUMBER}, unlike {since}")
+        library = self._library
+        newest = self._result(Call(library.newest_event, library.cancel), timeout)
+        if newest is None:
+            raise ServiceUnavailable
+        if since is not None:
+            check_newest(newest, since)
+        stream = EventStream(library, newest if since is None else since + 1)
+        self._streams.add(stream)
+        if self._is_closed:
+            stream.cancel()
+        return stream
+
+    def _result(self, call: Call[Result], timeout: float | None) -> Result:
+        if self._is_closed:
+            raise RuntimeError("the RAIDInstrumentation is closed")
+        try:
+            return call.result(timeout)
+        except TimeoutError:
+            raise ServiceUnavailable(f"gave no answer within {timeout:g} seconds") from None
