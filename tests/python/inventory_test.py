@@ -42,9 +42,10 @@ def served(raid: RAIDInstrumentation, document: Reply) -> Inventory:
 def test_an_example_reads_as_raidinfo_lists_it(raid: RAIDInstrumentation, example: str) -> None:
     with Simulator(example):
         listed = subprocess.run([build.RAIDINFO, "list", "--json"], capture_output=True, check=True)
-        assert json.loads(json.dumps(dataclasses.asdict(raid.inventory()))) == json.loads(
-            listed.stdout
-        )
+        lists = json.loads(json.dumps(dataclasses.asdict(raid.inventory())))
+    for key, records in json.loads(listed.stdout)["data"].items():
+        # raidinfo knows more of some records than their list does.
+        assert [record | mine for record, mine in zip(records, lists[key], strict=True)] == records
 
 
 def test_values_have_the_types_of_their_fields(raid: RAIDInstrumentation) -> None:

@@ -71,19 +71,19 @@ def test_what_is_used_besides_is_exported_in_both_widths(width: str) -> None:
 
 def raidinfos_table() -> dict[str, tuple[str, dict[str, tuple[str, str]]]]:
     """By the key of each list: the count function; function and shape of each field by its key."""
-    code = (build.SOURCES / "tools" / "raidinfo" / "kinds.cpp").read_text()
+    code = (build.SOURCES / "tools" / "raidinfo" / "inventory" / "kinds.cpp").read_text()
     text = r'\s*"([^"]*)"'
     fields = {
         name: {
             key: (function, shape)
             for function, key, _, shape in re.findall(
-                rf"\{{{text},{text},{text},\s*(\w+)(?:,\s*summary)?\}}", rows
+                rf"\{{{text},{text},{text},\s*(\w+)(?:,\s*(?:summary|chief))?\}}", rows
             )
         }
         for name, rows in re.findall(r"constexpr auto (\w+Fields) = .*?\(\{(.*?)\}\);", code, re.S)
     }
     kinds = re.findall(
-        rf"\{{KindId::\w+,{text},{text},{text},{text},{text},\s*(\w+Fields)\}}", code, re.S
+        rf"\{{KindId::\w+,{text},{text},{text},{text},{text},\s*(\w+Fields)(?:,\s*\w+)?\}}", code, re.S
     )
     return {key: (count, fields[name]) for count, key, _, _, _, name in kinds}
 

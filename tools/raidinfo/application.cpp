@@ -1,93 +1,128 @@
 #include "application.h"
 
-#include <unistd.h>
-
 #include <algorithm>
 #include <exception>
+#include <functional>
+#include <nlohmann/json.hpp>
+#include <optional>
+#include <span>
 #include <string>
+#include <string_view>
 #include <variant>
 
-#include "cancellable.h"
-#include "event_line.h"
+#include "command_line/options.h"
+#include "commands/commands.h"
 #include "exit_status.h"
-#include "json.h"
-#include "library.h"
-#include "options.h"
-#include "output.h"
-#include "service.h"
-#include "structure.h"
-#include "table.h"
-#include "tree.h"
+#include "health/nagios.h"
+#include "health/verdict.h"
+#include "json/envelope.h"
+#include "json/schema.h"
+#include "overloaded.h"
+#include "source/library.h"
+#include "system/cancellable.h"
+#include "system/output.h"
 
 namespace raidinfo {
 namespace {
 
-std::string inventoryText(const Options& options, const Inventory& inventory) {
-    if (options.command == Command::list) {
-        return options.json ? inventoryJson(inventory.snapshot) : tables(inventory.snapshot);
+/// What needs neither the library nor a service.
+std::optional<std::string> plainText(const CommandOptions& command) {
+    if (std::holds_alternative<CompletionOptions>(command)) {
+        return bashCompletion();
     }
-    const Group trees = adapterTrees(inventory.adapters, inventory.snapshot);
-    return options.json ? treeJson(trees) : drawn(trees);
+    if (std::holds_alternative<SchemaOptions>(command)) {
+        return document(schema());
+    }
+    return std::nullopt;
 }
 
-void showEvents(const Library& library, bool json, const Output& output,
-                const std::stop_token& stop) {
-    const auto show = [json, &output](const Records& events) {
-        std::string lines;
-        for (const Record& event : events) {
-            lines += json ? eventJson(event) : eventLine(event);
-        }
-        output.write(lines);
-    };
-    followEvents(library, show, stop);
-}
-
-Ending runCommand(const Options& options, const Output& output) {
+int runInLibrary(const Options& options, const Output& output) {
     CancellableRun cancellable;
     const Library library{options.library};
-    const auto work = [&options, &library, &output](const std::stop_token& stop) {
-        if (options.command == Command::events) {
-            showEvents(library, options.json, output, stop);
-            return;
-        }
-        const Inventory inventory = readInventory(library, stop);
-        output.write(inventoryText(options, inventory));
+    int status = 0;
+    const auto work = [&](const std::stop_token& stop) {
+        const Session session{options, library, output, stop};
+        status = std::visit(
+            Overloaded{[](const CompletionOptions&) { return 0; },
+                       [](const SchemaOptions&) { return 0; },
+                       [&session](const auto& command) { return runCommand(session, command); }},
+            options.command);
     };
-    return cancellable.run(work, library.function<void()>("cancelGetEvent"), options.limit);
-}
-
-int exitStatus(const Ending& ending) {
+    const Ending ending =
+        cancellable.run(work, library.function<void()>("cancelGetEvent"), options.limit);
     if (ending.timedOut) {
         throw Failure{ExitStatus::serviceUnavailable,
                       "the RAID management service gave no answer within the --timeout"};
     }
-    return ending.signal ? signalExitBase + *ending.signal : static_cast<int>(ExitStatus::ok);
+    return ending.signal ? signalExitBase + *ending.signal : status;
 }
 
-/// One line on standard error, whatever the message holds.
-int report(ExitStatus status, std::string message) {
-    std::ranges::replace(message, '\n', ' ');
-    message = "raidinfo: " + message + "\n";
-    // Nothing can be done when this fails too.
-    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, message.data(), message.size());
-    return static_cast<int>(status);
+/// Tells of a failure, and returns the exit status that it has in this subcommand.
+int fail(const Failure& failure, const Options& options, const Output& output) {
+    complain(failure.what());
+    const bool canWrite = failure.status() != ExitStatus::outputFailed;
+    if (options.json && canWrite) {
+        output.write(documentLine(enveloped(
+            sourceOf(options), {{troubleCode(failure.status()), failure.what()}}, nullptr)));
+    }
+    if (std::holds_alternative<DiffOptions>(options.command)) {
+        constexpr int trouble = 2;
+        return trouble;
+    }
+    if (const auto* const health = std::get_if<HealthOptions>(&options.command)) {
+        const health::Verdict unknown = health::unknownBecause(failure.what());
+        if (health->nagios && !options.json && canWrite) {
+            output.write(health::nagiosLine(unknown));
+        }
+        return health::exitStatus(unknown);
+    }
+    return static_cast<int>(failure.status());
+}
+
+int run(const Options& options, const Output& output) {
+    try {
+        if (const auto text = plainText(options.command)) {
+            output.write(*text);
+            return static_cast<int>(ExitStatus::ok);
+        }
+        return runInLibrary(options, output);
+    } catch (const Failure& failure) {
+        return fail(failure, options, output);
+    }
+}
+
+/// Of a command line that makes no sense, hence no Options.
+int refuse(const Failure& failure, std::span<const char* const> arguments, const Output& output) {
+    complain(failure.what());
+    if (std::ranges::find(arguments, std::string_view{"--json"}) != arguments.end()) {
+        output.write(documentLine(
+            enveloped({"none", ""}, {{troubleCode(failure.status()), failure.what()}}, nullptr)));
+    }
+    return static_cast<int>(failure.status());
 }
 
 }  // namespace
 
 int runProgram(int argc, const char* const* argv) {
     try {
-        const auto parsed = parseOptions(argc, argv);
         const Output output;
+        std::variant<Options, Information> parsed;
+        try {
+            parsed = parseOptions(argc, argv);
+        } catch (const Failure& failure) {
+            return refuse(failure, std::span{argv, static_cast<std::size_t>(argc)}, output);
+        }
         if (const auto* const information = std::get_if<Information>(&parsed)) {
             output.write(information->text);
             return static_cast<int>(ExitStatus::ok);
         }
-        return exitStatus(runCommand(std::get<Options>(parsed), output));
+        return run(std::get<Options>(parsed), output);
     } catch (const Failure& failure) {
-        return report(failure.status(), failure.what());
+        complain(failure.what());
+        return static_cast<int>(failure.status());
     } catch (const std::exception& error) {
-        return report(ExitStatus::internalError, error.what());
+        complain(error.what());
+        return static_cast<int>(ExitStatus::internalError);
     }
 }
 

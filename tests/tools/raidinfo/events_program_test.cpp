@@ -1,8 +1,11 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <chrono>
 #include <csignal>
+#include <cstdio>
+#include <fstream>
 #include <nlohmann/json.hpp>
 #include <sstream>
 
@@ -35,7 +38,10 @@ std::vector<int> numbers(const std::string& output) {
     std::vector<int> result;
     std::istringstream lines{output};
     for (std::string line; std::getline(lines, line);) {
-        result.push_back(json::parse(line).at("sequence_number"));
+        const json data = json::parse(line).at("data");
+        if (data.is_object()) {
+            result.push_back(data.at("sequence_number"));
+        }
     }
     return result;
 }
@@ -48,10 +54,11 @@ Result interrupt(Program& program, const ScriptedService& service, std::size_t c
 }
 
 TEST(EventsCommand, ShowsEventsFromTheNewestOnUntilInterrupted) {
-    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41})), awaited(),
-                                   answering(eventBatch({42, 43})), waiting}};
+    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41})), newest(41),
+                                   awaited(), answering(eventBatch({42, 43})), newest(43),
+                                   waiting}};
     Program program{raidinfo({"events"})};
-    const Result result = interrupt(program, service, 5);
+    const Result result = interrupt(program, service, 7);
     const std::string tail =
         "  (code 0, adapter 0, channel 1, device 3, enclosure 0, logical drive 0, "
         "server -, address -)\n";
@@ -60,21 +67,23 @@ TEST(EventsCommand, ShowsEventsFromTheNewestOnUntilInterrupted) {
                                  "43  2006-10-02  Warning  event 43" + tail);
     EXPECT_EQ(result.errors, "");
     EXPECT_EQ(result.status, 130);
-    EXPECT_THAT(service.request(5), HasSubstr(">43</as:lastRetrieved>"));
+    EXPECT_THAT(service.request(7), HasSubstr(">43</as:lastRetrieved>"));
 }
 
 TEST(EventsCommand, WritesOneJsonDocumentPerLine) {
-    const ScriptedService service{{newest(7), awaited(), answering(eventBatch({7, 8})), waiting}};
+    const ScriptedService service{
+        {newest(7), awaited(), answering(eventBatch({7, 8})), newest(8), waiting}};
     Program program{raidinfo({"events", "--json"})};
-    const Result result = interrupt(program, service, 3);
+    const Result result = interrupt(program, service, 4);
     EXPECT_THAT(numbers(result.output), ElementsAre(7, 8));
 }
 
 TEST(EventsCommand, WritesEventsAsSoonAsTheyCome) {
-    const ScriptedService service{{newest(7), awaited(), answering(eventBatch({7})), waiting}};
+    const ScriptedService service{
+        {newest(7), awaited(), answering(eventBatch({7})), newest(7), waiting}};
     Program program{raidinfo({"events", "--json"})};
     EXPECT_THAT(numbers(program.waitForOutput("\n")), ElementsAre(7));
-    EXPECT_EQ(interrupt(program, service, 3).status, 130);
+    EXPECT_EQ(interrupt(program, service, 4).status, 130);
 }
 
 TEST(EventsCommand, EndsAtOnceWhenInterruptedAndNotAfterTheSliceOfTheWait) {
@@ -89,39 +98,121 @@ TEST(EventsCommand, EndsAtOnceWhenInterruptedAndNotAfterTheSliceOfTheWait) {
 
 TEST(EventsCommand, ShowsNothingTwiceWhenAWaitFails) {
     // The failed wait publishes 41 and 42 again and advances the library's number to 45.
-    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41, 42})), failing,
-                                   failing, newest(44), awaited(),
-                                   answering(eventBatch({42, 43, 44, 44})), waiting}};
+    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41, 42})),
+                                   newest(42), failing, failing, newest(44), awaited(),
+                                   answering(eventBatch({42, 43, 44, 44})), newest(44), waiting}};
     Program program{raidinfo({"events", "--json"})};
-    const Result result = interrupt(program, service, 8);
+    const Result result = interrupt(program, service, 10);
     EXPECT_THAT(numbers(result.output), ElementsAre(41, 42, 43, 44));
-    EXPECT_THAT(service.request(7), HasSubstr(">43</as:start>"));
-    EXPECT_THAT(service.request(8), HasSubstr(">44</as:lastRetrieved>"));
+    EXPECT_THAT(service.request(8), HasSubstr(">43</as:start>"));
+    EXPECT_THAT(service.request(10), HasSubstr(">44</as:lastRetrieved>"));
 }
 
 TEST(EventsCommand, GoesOnAfterAnEmptyBatchAndAMalformedOne) {
     const ScriptedService service{{newest(3), awaited(), answering(eventBatch({})), newest(3),
                                    awaited(), answering("<"), newest(3), awaited(),
-                                   answering(eventBatch({3, 4})), waiting}};
+                                   answering(eventBatch({3, 4})), newest(4), waiting}};
     Program program{raidinfo({"events", "--json"})};
-    EXPECT_THAT(numbers(interrupt(program, service, 9).output), ElementsAre(3, 4));
+    EXPECT_THAT(numbers(interrupt(program, service, 10).output), ElementsAre(3, 4));
 }
 
-TEST(EventsCommand, SaysThatTheServiceWentAway) {
+TEST(EventsCommand, WaitsForAServiceThatGoesAwayAndSaysSoOnce) {
+    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41})), failing,
+                                   failing, newest(41), awaited(), answering(eventBatch({42})),
+                                   newest(42), waiting}};
+    Program program{raidinfo({"events"})};
+    const Result result = interrupt(program, service, 9);
+    EXPECT_EQ(result.errors,
+              "raidinfo: the RAID management service does not answer; waiting for it\n"
+              "raidinfo: the RAID management service answers again\n");
+    EXPECT_EQ(std::ranges::count(result.output, '\n'), 2);
+    EXPECT_EQ(result.status, 130);
+}
+
+TEST(EventsCommand, TellsProgramsWhatItTellsPeople) {
     const ScriptedService service{
-        {newest(41), awaited(), answering(eventBatch({41})), failing, failing, failing}};
-    const Result result = run({"events", "--json"});
-    EXPECT_THAT(numbers(result.output), ElementsAre(41));
-    EXPECT_THAT(result.errors, HasSubstr("does not answer"));
-    EXPECT_EQ(result.status, 69);
+        {newest(1), awaited(), answering(eventBatch({1, 4})), failing, newest(4), waiting}};
+    Program program{raidinfo({"events", "--json"})};
+    const Result result = interrupt(program, service, 5);
+    std::vector<std::string> codes;
+    std::istringstream lines{result.output};
+    for (std::string line; std::getline(lines, line);) {
+        const json document = json::parse(line);
+        EXPECT_EQ(document["complete"], document["errors"].empty());
+        for (const json& error : document["errors"]) {
+            codes.push_back(error["code"]);
+        }
+    }
+    EXPECT_THAT(codes, ElementsAre("events_missing", "service_unavailable", "service_available"));
+    EXPECT_THAT(result.errors, HasSubstr("events 2 to 3 are missing"));
+}
+
+TEST(EventsCommand, ShowsWhatComesAfterTheServiceHasBegunToCountAnew) {
+    const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41})), newest(2),
+                                   awaited(), answering(eventBatch({1, 2})), newest(2), waiting}};
+    Program program{raidinfo({"events", "--json"})};
+    const Result result = interrupt(program, service, 7);
+    EXPECT_THAT(numbers(result.output), ElementsAre(41, 1, 2));
+    EXPECT_THAT(result.errors, HasSubstr("newest event is 2 after 41"));
+}
+
+TEST(EventsCommand, PassesOverNumbersThatTheServiceNoLongerHas) {
+    const ScriptedService service{{newest(300), awaited(), answering(eventBatch({})), newest(300),
+                                   awaited(), answering(eventBatch({})), newest(300), awaited(),
+                                   answering(eventBatch({299, 300})), newest(300), waiting}};
+    Program program{raidinfo({"events", "--json", "--since", "1"})};
+    const Result result = interrupt(program, service, 10);
+    EXPECT_THAT(numbers(result.output), ElementsAre(299, 300));
+    EXPECT_THAT(service.request(5), HasSubstr(">102</as:start>"));
+    EXPECT_THAT(service.request(8), HasSubstr(">203</as:start>"));
+    EXPECT_THAT(result.errors, HasSubstr("events 1 to 298 are missing"));
+}
+
+TEST(EventsCommand, EndsAfterAsManyEventsAsWereAskedFor) {
+    const ScriptedService service{{newest(9), awaited(), answering(eventBatch({5, 6, 7}))}};
+    const Result result = run({"events", "--json", "--since", "5", "--count", "2"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(5, 6));
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(service.request(2), HasSubstr(">5</as:start>"));
+}
+
+TEST(EventsCommand, GoesOnWhereItEndedTheLastTime) {
+    const ScriptedService service{{newest(9), awaited(), answering(eventBatch({5, 6})), newest(9),
+                                   awaited(), answering(eventBatch({6, 7, 8}))}};
+    static_cast<void>(
+        run({"events", "--json", "--since", "5", "--count", "1", "--state", "events.state"}));
+    const Result result = run({"events", "--json", "--count", "2", "--state", "events.state"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(6, 7));
+    EXPECT_THAT(service.request(5), HasSubstr(">6</as:start>"));
+    std::remove("events.state");
+}
+
+TEST(EventsCommand, HandsEachEventToAProgram) {
+    const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5, 6}))}};
+    const Result result = run({"events", "--count", "2", "--exec", "cat >>hook.out"});
+    EXPECT_EQ(result.status, 0);
+    std::ostringstream given;
+    given << std::ifstream{"hook.out"}.rdbuf();
+    EXPECT_THAT(numbers(given.str()), ElementsAre(5, 6));
+    std::remove("hook.out");
+}
+
+TEST(EventsCommand, SaysThatTheProgramFailedAndGoesOn) {
+    const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5, 6}))}};
+    const Result result = run({"events", "--count", "2", "--exec", "exit 3"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(std::ranges::count(result.output, '\n'), 2);
+    EXPECT_EQ(result.errors,
+              "raidinfo: the command for the event ended with status 3\n"
+              "raidinfo: the command for the event ended with status 3\n");
 }
 
 TEST(EventsCommand, FollowsFromTheLargestNumberThereIs) {
     const int largest = 2147483647;
     const ScriptedService service{
-        {newest(largest), awaited(), answering(eventBatch({largest})), waiting}};
+        {newest(largest), awaited(), answering(eventBatch({largest})), newest(largest), waiting}};
     Program program{raidinfo({"events", "--json"})};
-    EXPECT_THAT(numbers(interrupt(program, service, 3).output), ElementsAre(largest));
+    EXPECT_THAT(numbers(interrupt(program, service, 4).output), ElementsAre(largest));
 }
 
 }  // namespace

@@ -2,6 +2,8 @@
 #include <gtest/gtest.h>
 
 #include <csignal>
+#include <nlohmann/json.hpp>
+#include <tuple>
 
 #include "documents.h"
 #include "program.h"
@@ -10,6 +12,7 @@
 namespace raidinfo::test {
 namespace {
 
+using nlohmann::json;
 using raid::test::answering;
 using raid::test::Connection;
 using raid::test::End;
@@ -28,8 +31,27 @@ void expectFailure(const Result& result, int status, const std::string& reason) 
 }
 
 TEST(FailingProgram, SaysThatTheServiceDoesNotAnswer) {
-    for (const std::string command : {"list", "tree", "events"}) {
-        expectFailure(run({command, "--json"}), 69, "does not answer");
+    for (const std::string command : {"list", "tree", "events", "watch"}) {
+        expectFailure(run({command}), 69, "does not answer");
+    }
+}
+
+TEST(FailingProgram, WritesOneDocumentThatSaysWhyForPrograms) {
+    for (const auto& [arguments, status, code] :
+         std::vector<std::tuple<std::vector<std::string>, int, std::string>>{
+             {{"list", "--json"}, 69, "service_unavailable"},
+             {{"events", "--json"}, 69, "service_unavailable"},
+             {{"lists", "--json"}, 64, "usage"},
+             {{"tree", "--json", "--library", "nowhere.so"}, 72, "unusable_library"},
+             {{"tree", "--json", "--from", "nowhere"}, 66, "no_input"}}) {
+        const Result result = run(arguments);
+        EXPECT_EQ(result.status, status);
+        EXPECT_THAT(result.errors, MatchesRegex("raidinfo: [^\n]*\n"));
+        const json document = json::parse(result.output);
+        EXPECT_EQ(document["complete"], false);
+        EXPECT_EQ(document["errors"].size(), 1U);
+        EXPECT_EQ(document["errors"][0]["code"], code);
+        EXPECT_TRUE(document["data"].is_null());
     }
 }
 
@@ -42,14 +64,18 @@ TEST(FailingProgram, SaysThatTheAnswerIsMalformed) {
     const std::string cut = configuration(sampleAdapter()).substr(0, 900);
     const ScriptedService service{
         {answering(cut), answering(newestEventDocument("0")), answering(cut)}};
-    expectFailure(run({"tree", "--json"}), 76, "malformed");
+    expectFailure(run({"tree"}), 76, "malformed");
 }
 
 TEST(FailingProgram, SaysThatTheEventsAreMalformed) {
     const std::string batch = eventBatch({1}).substr(0, 400);
-    const Connection newest = answering(newestEventDocument("1"));
-    const ScriptedService service{
-        {newest, answering(""), answering(batch), newest, answering(""), answering(batch), newest}};
+    std::vector<Connection> connections;
+    for (int read = 0; read < 5; ++read) {
+        connections.push_back(answering(newestEventDocument("1")));
+        connections.push_back(answering(""));
+        connections.push_back(answering(batch));
+    }
+    const ScriptedService service{connections};
     expectFailure(run({"events"}), 76, "malformed");
 }
 
@@ -77,7 +103,7 @@ TEST(FailingProgram, SaysWhatALibraryLacks) {
 }
 
 TEST(FailingProgram, RefusesAWrongCommandLine) {
-    expectFailure(run({}), 64, "expected one of list, tree, events");
+    expectFailure(run({}), 64, "expected one of list, show, tree, events");
     expectFailure(run({"lists"}), 64, "--help");
     expectFailure(run({"list", "--jsn"}), 64, "--jsn");
 }

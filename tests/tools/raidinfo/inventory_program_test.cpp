@@ -25,19 +25,22 @@ Result runWith(const std::string& document, std::vector<std::string> arguments) 
 json dataOf(const Result& result) {
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.errors, "");
-    return json::parse(result.output);
+    const json document = json::parse(result.output);
+    EXPECT_EQ(document["complete"], true);
+    return document["data"];
 }
 
 TEST(ListCommand, ShowsEveryListAsATable) {
     const Result result = runWith(configuration(sampleAdapter()), {"list"});
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.errors, "");
-    EXPECT_THAT(result.output, StartsWith("Pellion adapters: 1\n  #  Adapter name       Overall "));
+    EXPECT_THAT(result.output,
+                StartsWith("Pellion adapters: 1\n  #  Adapter type      Adapter name  "));
     EXPECT_THAT(result.output, HasSubstr("\n\nChannels: 2\n"
                                          "  #  Channel name    Adapter name  Channel ID  Adapter ID"
-                                         "  Type  Transfer speed  Initiator ID\n"
+                                         "  Type               Transfer speed  Initiator ID\n"
                                          "  0  SCSI Channel 1  Controller 0           1           0"
-                                         "     0               0             7\n"));
+                                         "  0 (parallel SCSI)          0 MB/s             7\n"));
     EXPECT_THAT(result.output, HasSubstr("  Smith & Sons  "));
     EXPECT_THAT(result.output, HasSubstr("\n\nPower supplies: 0\n\nTemperature sensors: 2\n"));
 }
@@ -57,7 +60,7 @@ TEST(ListCommand, WritesEveryFieldAsJson) {
     EXPECT_EQ(lists["pellion_adapters"][0]["initiator_ids"], json({7, 7}));
     EXPECT_EQ(lists["pellion_adapters"][0]["overall_status"], "Warning");
     EXPECT_EQ(lists["disk_drives"][1], json::parse(R"({
-        "position": 1, "disk_drive_name": "Disk Drive 0", "channel_name": "Channel 1",
+        "position": 1, "device_id": 2, "hot_spare": true, "disk_drive_name": "Disk Drive 0", "channel_name": "Channel 1",
         "adapter_name": "Controller 0", "overall_status": "Normal", "channel_id": 1,
         "adapter_id": 0, "array_id": 0, "array_unique_id": 0, "vendor": "Smith & Sons",
         "model": "", "serial_number": "", "fru_number": "", "firmware_level": "",
@@ -110,30 +113,32 @@ TEST(TreeCommand, ShowsWhatBelongsToWhat) {
                 {"tree"});
     EXPECT_EQ(result.status, 0);
     EXPECT_EQ(result.errors, "");
-    EXPECT_EQ(result.output,
-              "Pellion adapter 0: Warning, type name Pellion 4220, physical slot 0\n"
-              "├─ Channel 1: transfer speed 0, initiator ID 7\n"
-              "│  ├─ Disk drive 0: Normal, vendor Smith & Sons, size 34715, state 0\n"
-              "│  ├─ Disk drive 2: hot spare, Normal, vendor Smith & Sons, size 34715, state 0\n"
-              "│  └─ Enclosure 15: Normal, state 0\n"
-              "│     ├─ Fan 0: status 1\n"
-              "│     └─ Temperature sensor 0: status 40\n"
-              "├─ Channel 2: transfer speed 0, initiator ID 7\n"
-              "│  ├─ Disk drive 0: Normal, vendor Smith & Sons, size 34715, state 0\n"
-              "│  └─ Enclosure 14: Normal, state 0\n"
-              "│     ├─ Fan 0: status 1\n"
-              "│     ├─ Fan 1: status 1\n"
-              "│     └─ Temperature sensor 0: status 40\n"
-              "├─ Array 0: size 0, free space 0, stripe size 0\n"
-              "│  ├─ Logical drive 0: Normal, RAID level 5, state 0, data space 0\n"
-              "│  ├─ Disk drive 0: channel 1\n"
-              "│  └─ Disk drive 9: channel 1, not present\n"
-              "├─ Spanned array 5: size 0, free space 0, stripe size 0\n"
-              "│  ├─ Logical drive 1: Normal, RAID level 5, state 0, data space 0\n"
-              "│  └─ Array 6: size 0, free space 0, stripe size 0\n"
-              "│     └─ Disk drive 0: channel 2\n"
-              "└─ Logical drive 2: Normal, RAID level 5, state 0, data space 0\n"
-              "Adapter 3: unknown type \"o:Other\"\n");
+    EXPECT_EQ(
+        result.output,
+        "Pellion adapter 0: Warning, type name Pellion 4220, physical slot 0\n"
+        "├─ Channel 1: transfer speed 0 MB/s, initiator ID 7\n"
+        "│  ├─ Disk drive 0: Normal, vendor Smith & Sons, size 34715 MB, state 0 (ready)\n"
+        "│  ├─ Disk drive 2: hot spare, Normal, vendor Smith & Sons, size 34715 MB, state 0 "
+        "(ready)\n"
+        "│  └─ Enclosure 15: Normal, state 0 (absent)\n"
+        "│     ├─ Fan 0: status 1 (warning)\n"
+        "│     └─ Temperature sensor 0: status 40 (unknown)\n"
+        "├─ Channel 2: transfer speed 0 MB/s, initiator ID 7\n"
+        "│  ├─ Disk drive 0: Normal, vendor Smith & Sons, size 34715 MB, state 0 (ready)\n"
+        "│  └─ Enclosure 14: Normal, state 0 (absent)\n"
+        "│     ├─ Fan 0: status 1 (warning)\n"
+        "│     ├─ Fan 1: status 1 (warning)\n"
+        "│     └─ Temperature sensor 0: status 40 (unknown)\n"
+        "├─ Array 0: size 0 MB, free space 0 MB, stripe size 0 KB\n"
+        "│  ├─ Logical drive 0: Normal, RAID level 5 (RAID 5), state 0 (normal), data space 0 MB\n"
+        "│  ├─ Disk drive 0: channel 1\n"
+        "│  └─ Disk drive 9: channel 1, not present\n"
+        "├─ Spanned array 5: size 0 MB, free space 0 MB, stripe size 0 KB\n"
+        "│  ├─ Logical drive 1: Normal, RAID level 5 (RAID 5), state 0 (normal), data space 0 MB\n"
+        "│  └─ Array 6: size 0 MB, free space 0 MB, stripe size 0 KB\n"
+        "│     └─ Disk drive 0: channel 2\n"
+        "└─ Logical drive 2: Normal, RAID level 5 (RAID 5), state 0 (normal), data space 0 MB\n"
+        "Adapter 3: unknown type \"o:Other\"\n");
 }
 
 TEST(TreeCommand, NestsTheSameAsJson) {
@@ -162,7 +167,7 @@ TEST(TreeCommand, ShowsAnUnpublishedArrayInsideTwoSpannedArrays) {
         complex("adapter", "o:LSIAdapter", complex("arrays", "o:Arrays", arrays));
     EXPECT_EQ(runWith(configuration(adapter), {"tree"}).output,
               "LSI adapter 0: Normal, physical slot 0\n"
-              "└─ Spanned array 1: size 0, free space 0, stripe size 0\n"
+              "└─ Spanned array 1: size 0 MB, free space 0 MB, stripe size 0 KB\n"
               "   └─ Spanned array 2: not published\n"
               "      └─ Array 3: not published\n");
 }

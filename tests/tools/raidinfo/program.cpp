@@ -61,6 +61,15 @@ bool readInto(std::string& text, Socket& stream) {
     return count == 0;
 }
 
+int occurrences(std::string_view text, std::string_view output) {
+    int count = 0;
+    for (std::size_t place = output.find(text); place != std::string_view::npos;
+         place = output.find(text, place + text.size())) {
+        ++count;
+    }
+    return count;
+}
+
 }  // namespace
 
 Program::Program(std::vector<std::string> command) : input{-1}, output{-1}, errors{-1} {
@@ -84,10 +93,12 @@ void Program::send(std::string_view text) {
     throwIfNegative(write(input.get(), text.data(), text.size()), "write to a program");
 }
 
+void Program::endInput() noexcept { input.close(); }
+
 void Program::signal(int number) const { throwIfNegative(kill(process, number), "signal"); }
 
-std::string Program::waitForOutput(std::string_view text) {
-    while (result.output.find(text) == std::string::npos) {
+std::string Program::waitForOutput(std::string_view text, int times) {
+    while (occurrences(text, result.output) < times) {
         if (!readMore()) {
             throw std::runtime_error{"the program ended without the output expected; it wrote:\n" +
                                      result.output + result.errors};

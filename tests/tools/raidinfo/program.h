@@ -26,9 +26,10 @@ public:
     ~Program();
 
     void send(std::string_view input);
+    void endInput() noexcept;
     void signal(int number) const;
-    // Returns the output so far, once it has the text in it.
-    std::string waitForOutput(std::string_view text);
+    // Returns the output so far, once it has the text in it so often.
+    std::string waitForOutput(std::string_view text, int times = 1);
     Result finish();
 
 private:

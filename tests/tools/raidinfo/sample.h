@@ -3,7 +3,7 @@
 #include <map>
 #include <string_view>
 
-#include "records.h"
+#include "inventory/records.h"
 
 namespace raidinfo::test {
 

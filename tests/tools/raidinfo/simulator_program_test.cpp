@@ -5,26 +5,13 @@
 #include <nlohmann/json.hpp>
 
 #include "program.h"
+#include "simulator.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
 using testing::HasSubstr;
-
-// The simulated service with one of the shipped configurations.
-class Simulator {
-public:
-    explicit Simulator(const std::string& example)
-        : program{{RAIDSIM_PROGRAM, RAID_EXAMPLES "/" + example}} {
-        program.waitForOutput("listening");
-    }
-
-    void command(const std::string& line) { program.send(line + "\n"); }
-
-private:
-    Program program;
-};
 
 std::size_t countOf(const json& tree, const std::string& key) {
     std::size_t count = 0;
@@ -46,8 +33,8 @@ TEST_P(ShippedExample, IsListedAndDrawnCompletely) {
     const Result list = run({"list", "--json"});
     const Result tree = run({"tree", "--json"});
     EXPECT_EQ(list.errors + tree.errors, "");
-    const json lists = json::parse(list.output);
-    const json trees = json::parse(tree.output);
+    const json lists = json::parse(list.output)["data"];
+    const json trees = json::parse(tree.output)["data"];
     for (const std::string key :
          {"channels", "enclosures", "fans", "power_supplies", "temperature_sensors", "arrays",
           "spanned_arrays", "logical_drives"}) {

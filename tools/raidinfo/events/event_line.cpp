@@ -1,6 +1,6 @@
-#include "event_line.h"
+#include "events/event_line.h"
 
-#include "table.h"
+#include "presentation/table.h"
 
 namespace raidinfo {
 

@@ -2,7 +2,7 @@
 
 #include <string>
 
-#include "records.h"
+#include "inventory/records.h"
 
 namespace raidinfo {
 

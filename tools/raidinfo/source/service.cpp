@@ -1,5 +1,6 @@
-#include "service.h"
-#include "service_failures.h"
+#include "source/service.h"
+
+#include "source/service_failures.h"
 
 namespace raidinfo {
 
@@ -9,13 +10,13 @@ namespace raidinfo {
 // before it is called malformed.
 Inventory readInventory(const Library& library, const std::stop_token& stop) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
-    library.function<int()>("RAIDinit")();
+    const auto read = library.function<int()>("RAIDinit");
+    read();
     if (*system == nullptr && !stop.stop_requested()) {
         if (library.function<int()>("enableRAIDEvent")() == 0) {
             throw serviceUnavailable();
         }
-        library.function<void()>("setRefreshFlag")();
-        library.function<int()>(inventoryKinds().front().count)();
+        read();
     }
     if (*system == nullptr) {
         throw malformedAnswer();

@@ -1,8 +1,9 @@
-#include "options.h"
+#include "command_line/options.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <string>
 #include <vector>
 
 #include "exit_status.h"
@@ -10,6 +11,7 @@
 namespace raidinfo {
 namespace {
 
+using testing::ElementsAre;
 using testing::HasSubstr;
 
 std::variant<Options, Information> parse(std::vector<const char*> arguments) {
@@ -21,51 +23,134 @@ Options options(std::vector<const char*> arguments) {
     return std::get<Options>(parse(std::move(arguments)));
 }
 
+template <typename Command>
+Command command(std::vector<const char*> arguments) {
+    return std::get<Command>(options(std::move(arguments)).command);
+}
+
 std::string information(std::vector<const char*> arguments) {
     return std::get<Information>(parse(std::move(arguments))).text;
 }
 
-TEST(Options, NameTheCommand) {
-    EXPECT_EQ(options({"list"}).command, Command::list);
-    EXPECT_EQ(options({"tree"}).command, Command::tree);
-    EXPECT_EQ(options({"events"}).command, Command::events);
+std::string complaint(std::vector<const char*> arguments) {
+    try {
+        static_cast<void>(parse(std::move(arguments)));
+    } catch (const Failure& failure) {
+        EXPECT_EQ(failure.status(), ExitStatus::usage);
+        return failure.what();
+    }
+    return "accepted";
 }
 
 TEST(Options, AskForJsonAndALibraryOnEitherSideOfTheCommand) {
     EXPECT_FALSE(options({"list"}).json);
     EXPECT_TRUE(options({"tree", "--json"}).json);
+    EXPECT_TRUE(options({"--json", "tree"}).json);
     EXPECT_EQ(options({"list"}).library, std::nullopt);
     EXPECT_EQ(options({"--library", "a.so", "list"}).library, "a.so");
     EXPECT_EQ(options({"events", "--library", "b.so"}).library, "b.so");
 }
 
-TEST(Options, LimitTheWaitForTheInventoryOnly) {
+TEST(Options, LimitTheWaitButOfWhatFollowsTheService) {
     EXPECT_EQ(options({"list"}).limit, std::chrono::seconds{60});
     EXPECT_EQ(options({"tree", "--timeout", "5"}).limit, std::chrono::seconds{5});
     EXPECT_EQ(options({"tree", "--timeout", "0"}).limit, std::nullopt);
     EXPECT_EQ(options({"events", "--timeout", "5"}).limit, std::nullopt);
+    EXPECT_EQ(options({"watch"}).limit, std::nullopt);
+    EXPECT_EQ(options({"record", "file"}).limit, std::nullopt);
+    EXPECT_EQ(command<DoctorOptions>({"doctor"}).limit, std::chrono::seconds{60});
+}
+
+TEST(Options, ChooseTheColour) {
+    EXPECT_EQ(options({"list"}).color, ColorChoice::automatic);
+    EXPECT_EQ(options({"list", "--color=always"}).color, ColorChoice::always);
+    EXPECT_EQ(options({"--color", "never", "list"}).color, ColorChoice::never);
+    EXPECT_THAT(complaint({"list", "--color=red"}), HasSubstr("auto, always or never"));
+}
+
+TEST(ListOptions, ChooseAKindItsColumnsAndItsRecords) {
+    EXPECT_EQ(command<ListOptions>({"list"}).kind, nullptr);
+    const auto list = command<ListOptions>({"list", "fans", "-o", "+adapter_name", "--filter",
+                                            "status!=0", "--filter", "index>1", "--noheadings"});
+    EXPECT_EQ(list.kind, &kindOf(KindId::fan));
+    EXPECT_TRUE(list.columns->chief);
+    EXPECT_THAT(list.columns->keys, ElementsAre("adapter_name"));
+    ASSERT_EQ(list.filters.size(), 2U);
+    EXPECT_EQ(list.filters[1].key, "index");
+    EXPECT_FALSE(list.headings);
+}
+
+TEST(ListOptions, HaveColumnsForOneKindOnly) {
+    EXPECT_THAT(complaint({"list", "-o", "size"}), HasSubstr("one KIND only"));
+    EXPECT_TRUE(command<ListOptions>({"list", "-o", "all"}).columns->all);
+}
+
+TEST(ListOptions, NameTheKindsThereAreWhenOneIsWrong) {
+    EXPECT_THAT(complaint({"list", "disks"}),
+                testing::AllOf(HasSubstr("\"disks\""), HasSubstr("disk_drives")));
+}
+
+TEST(ShowOptions, NameAKindAndAPosition) {
+    const auto show = command<ShowOptions>({"show", "disk_drives", "3"});
+    EXPECT_EQ(show.kind, &kindOf(KindId::diskDrive));
+    EXPECT_EQ(show.position, 3);
+    EXPECT_THAT(complaint({"show", "disk_drives"}), HasSubstr("position"));
+    EXPECT_THAT(complaint({"show", "disk_drives", "-1"}), HasSubstr("-1"));
+}
+
+TEST(EventsOptions, SayWhereToBeginAndWhenToEnd) {
+    const auto plain = command<EventsOptions>({"events"});
+    EXPECT_EQ(plain.since, std::nullopt);
+    EXPECT_EQ(plain.count, std::nullopt);
+    EXPECT_EQ(plain.state, std::nullopt);
+    const auto all = command<EventsOptions>(
+        {"events", "--since", "0", "--count", "7", "--exec", "logger -t raid", "--state", "file"});
+    EXPECT_EQ(all.since, 0);
+    EXPECT_EQ(all.count, 7);
+    EXPECT_EQ(all.command, "logger -t raid");
+    EXPECT_EQ(all.state, "file");
+}
+
+TEST(WatchOptions, HaveAnInterval) {
+    EXPECT_EQ(command<WatchOptions>({"watch"}).interval, std::chrono::seconds{5});
+    EXPECT_EQ(command<WatchOptions>({"watch", "--interval", "9"}).interval,
+              std::chrono::seconds{9});
+}
+
+TEST(RecordOptions, MayEndByThemselves) {
+    EXPECT_EQ(command<RecordOptions>({"record", "f"}).duration, std::nullopt);
+    const auto record = command<RecordOptions>({"record", "--redact", "--for", "0", "f"});
+    EXPECT_TRUE(record.redact);
+    EXPECT_EQ(record.duration, std::chrono::seconds{0});
+}
+
+TEST(DiffOptions, NameOneSnapshotOrTwo) {
+    EXPECT_EQ(command<DiffOptions>({"diff", "a"}).after, "");
+    EXPECT_EQ(command<DiffOptions>({"diff", "a", "b"}).after, "b");
 }
 
 TEST(Options, ThatAreWrongAreAUsageFailure) {
     using Arguments = std::vector<const char*>;
     for (const Arguments& wrong :
-         {Arguments{}, Arguments{"lists"}, Arguments{"list", "tree", "--jso"},
-          Arguments{"list", "--jsonn"}, Arguments{"list", "extra"}, Arguments{"--json", "list"},
+         {Arguments{}, Arguments{"lists"}, Arguments{"tree", "list", "--jso"},
+          Arguments{"list", "--jsonn"}, Arguments{"tree", "extra"},
           Arguments{"list", "--timeout", "-1"}, Arguments{"list", "--timeout", "soon"},
-          Arguments{"list", "--library"}}) {
-        try {
-            static_cast<void>(parse(wrong));
-            FAIL() << "accepted: " << testing::PrintToString(wrong);
-        } catch (const Failure& failure) {
-            EXPECT_EQ(failure.status(), ExitStatus::usage);
-        }
+          Arguments{"list", "--library"}, Arguments{"list", "--filter", "state"},
+          Arguments{"list", "fans", "-o", ","}, Arguments{"events", "--count", "0"},
+          Arguments{"watch", "--interval", "0"}, Arguments{"snapshot"}, Arguments{"diff"}}) {
+        EXPECT_NE(complaint(wrong), "accepted") << testing::PrintToString(wrong);
     }
 }
 
 TEST(Options, ExplainThemselves) {
     EXPECT_THAT(information({"--help"}), HasSubstr("130 interrupted"));
-    EXPECT_THAT(information({"events", "--help"}), HasSubstr("raidinfo events"));
     EXPECT_THAT(information({"--version"}), testing::StartsWith("raidinfo "));
+    for (const char* const name : {"list", "show", "tree", "events", "watch", "health", "snapshot",
+                                   "diff", "record", "doctor", "completion", "schema"}) {
+        EXPECT_THAT(information({"--help"}), HasSubstr(name));
+        EXPECT_THAT(information({name, "--help"}),
+                    testing::ContainsRegex("Examples?:\\s+raidinfo " + std::string{name}));
+    }
 }
 
 }  // namespace

@@ -1,0 +1,128 @@
+#include "events/continuity.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "sample.h"
+
+namespace raidinfo {
+namespace {
+
+using test::sample;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+Record event(int number, const std::string& message = "") {
+    return sample(eventKind(), {{"sequence_number", number}, {"message_string", message}});
+}
+
+Records batch(const std::vector<int>& numbers) {
+    Records events;
+    for (const int number : numbers) {
+        events.push_back(event(number));
+    }
+    return events;
+}
+
+std::vector<int> shownEvents(Continuity& continuity, const Records& events) {
+    std::vector<int> numbers;
+    for (const std::size_t place : continuity.accept(events).fresh) {
+        numbers.push_back(numberOf(eventKind(), events[place], "sequence_number"));
+    }
+    return numbers;
+}
+
+std::vector<int> shownOf(Continuity& continuity, const std::vector<int>& numbers) {
+    return shownEvents(continuity, batch(numbers));
+}
+
+TEST(Continuity, ShowsEachEventOnce) {
+    Continuity continuity{41};
+    EXPECT_THAT(shownOf(continuity, {41, 42}), ElementsAre(41, 42));
+    EXPECT_THAT(shownOf(continuity, {41, 42}), IsEmpty());
+    EXPECT_THAT(shownOf(continuity, {42, 43, 44, 44}), ElementsAre(43, 44));
+    EXPECT_EQ(continuity.next(), 45);
+    EXPECT_EQ(continuity.last(), 44);
+}
+
+TEST(Continuity, PassesOverWhatIsBeforeItsBeginning) {
+    Continuity continuity{41};
+    EXPECT_THAT(shownOf(continuity, {39, 40, 41}), ElementsAre(41));
+}
+
+TEST(Continuity, GoesOnAfterTheLastNumberOfAnEarlierRun) {
+    Continuity continuity = Continuity::after(41);
+    EXPECT_EQ(continuity.next(), 42);
+    EXPECT_THAT(shownOf(continuity, {41, 42}), ElementsAre(42));
+}
+
+TEST(Continuity, TellsWhatIsMissing) {
+    Continuity continuity{1};
+    EXPECT_THAT(continuity.accept(batch({1, 2, 5, 7})).missing,
+                ElementsAre(MissingNumbers{3, 4}, MissingNumbers{6, 6}));
+    EXPECT_THAT(continuity.accept(batch({10})).missing, ElementsAre(MissingNumbers{8, 9}));
+    EXPECT_THAT(continuity.accept(batch({11})).missing, IsEmpty());
+}
+
+TEST(Continuity, MissesNothingBeforeTheFirstEventWhereAnyMayBeTheFirst) {
+    Continuity continuity{0};
+    EXPECT_THAT(continuity.accept(batch({500, 501})).missing, IsEmpty());
+    EXPECT_EQ(continuity.next(), 502);
+}
+
+TEST(Continuity, TakesTheOrderInWhichABatchIsSent) {
+    Continuity continuity{1};
+    const Continuity::Accepted accepted = continuity.accept(batch({2, 3, 1}));
+    EXPECT_THAT(accepted.fresh, ElementsAre(0U, 1U, 2U));
+    EXPECT_THAT(accepted.missing, IsEmpty());
+}
+
+TEST(Continuity, ShowsAnEventThatComesLate) {
+    Continuity continuity{1};
+    EXPECT_THAT(shownOf(continuity, {1, 5}), ElementsAre(1, 5));
+    EXPECT_THAT(shownOf(continuity, {3}), ElementsAre(3));
+    EXPECT_THAT(shownOf(continuity, {2, 3, 4, 4, 5}), ElementsAre(2, 4));
+    EXPECT_THAT(shownOf(continuity, {2, 3, 4}), IsEmpty());
+}
+
+TEST(Continuity, NoticesThatTheServiceCountsAnew) {
+    Continuity continuity{1};
+    EXPECT_FALSE(continuity.beganAnew(7));
+    EXPECT_THAT(shownOf(continuity, {6, 7}), ElementsAre(6, 7));
+    EXPECT_FALSE(continuity.beganAnew(7));
+    EXPECT_FALSE(continuity.beganAnew(8));
+    EXPECT_TRUE(continuity.beganAnew(3));
+    EXPECT_EQ(continuity.next(), 0);
+    EXPECT_THAT(shownOf(continuity, {1, 2, 3}), ElementsAre(1, 2, 3));
+    EXPECT_FALSE(continuity.beganAnew(3));
+}
+
+TEST(Continuity, KnowsByTheirContentWhatItShowedBeforeTheServiceCountedAnew) {
+    Continuity continuity{1};
+    EXPECT_THAT(shownEvents(continuity, {event(1, "old"), event(2, "old"), event(3, "lost")}),
+                ElementsAre(1, 2, 3));
+    EXPECT_TRUE(continuity.beganAnew(2));
+    EXPECT_THAT(shownEvents(continuity, {event(1, "old"), event(2, "old"), event(3, "new")}),
+                ElementsAre(3));
+}
+
+TEST(Continuity, AsksNotAgainWhereThereIsNothing) {
+    Continuity continuity{1};
+    continuity.passOverTo(102);
+    EXPECT_EQ(continuity.next(), 102);
+    const Continuity::Accepted accepted = continuity.accept(batch({500}));
+    EXPECT_THAT(accepted.missing, ElementsAre(MissingNumbers{1, 499}));
+    EXPECT_EQ(continuity.next(), 501);
+}
+
+TEST(Continuity, CountsBeyondTheLargestNumber) {
+    Continuity continuity{2147483647};
+    EXPECT_THAT(shownOf(continuity, {2147483647}), ElementsAre(2147483647));
+    EXPECT_EQ(continuity.next(), 2147483648);
+    EXPECT_THAT(shownOf(continuity, {2147483647}), IsEmpty());
+}
+
+}  // namespace
+}  // namespace raidinfo

@@ -1,0 +1,109 @@
+#include "system/cancellable.h"
+
+#include <gtest/gtest.h>
+#include <poll.h>
+#include <unistd.h>
+
+#include <atomic>
+#include <cerrno>
+#include <csignal>
+#include <future>
+#include <stdexcept>
+#include <utility>
+
+namespace raidinfo {
+namespace {
+
+constexpr std::chrono::milliseconds soon{1};
+
+void noCancel() { FAIL() << "cancelled"; }
+
+TEST(CancellableRun, EndsWithTheWork) {
+    bool done = false;
+    const Ending ending =
+        CancellableRun{}.run([&done](const std::stop_token&) { done = true; }, noCancel, {});
+    EXPECT_TRUE(done);
+    EXPECT_FALSE(ending.timedOut);
+    EXPECT_FALSE(ending.signal);
+}
+
+TEST(CancellableRun, PassesOnWhatTheWorkThrows) {
+    CancellableRun run;
+    EXPECT_THROW(run.run([](const std::stop_token&) { throw std::domain_error{"no"}; }, noCancel,
+                         std::chrono::minutes{1}),
+                 std::domain_error);
+}
+
+TEST(CancellableRun, RepeatsTheCancelUntilTheWorkHasEnded) {
+    std::atomic<int> cancels = 0;
+    const Ending ending = CancellableRun{}.run(
+        [&cancels](const std::stop_token&) {
+            for (int seen = cancels; seen < 3; seen = cancels) {
+                cancels.wait(seen);
+            }
+        },
+        [&cancels] {
+            ++cancels;
+            cancels.notify_all();
+        },
+        soon);
+    EXPECT_TRUE(ending.timedOut);
+    EXPECT_EQ(cancels, 3);
+}
+
+TEST(CancellableRun, InterruptsTheSystemCallThatTheWorkWaitsIn) {
+    int result = 0;
+    int error = 0;
+    const Ending ending = CancellableRun{}.run(
+        [&](const std::stop_token& stop) {
+            do {
+                result = poll(nullptr, 0, -1);
+                error = errno;
+            } while (!stop.stop_requested());
+        },
+        [] {}, soon);
+    EXPECT_TRUE(ending.timedOut);
+    EXPECT_EQ(result, -1);
+    EXPECT_EQ(error, EINTR);
+}
+
+TEST(CancellableRun, ReportsTheSignalThatEndedIt) {
+    for (const int signal : {SIGINT, SIGTERM}) {
+        CancellableRun run;
+        std::promise<void> cancelled;
+        const Ending ending = run.run(
+            [signal, &cancelled](const std::stop_token&) {
+                kill(getpid(), signal);
+                cancelled.get_future().wait();
+                throw std::domain_error{"a failure of work that was cancelled means nothing"};
+            },
+            [&cancelled, first = true]() mutable {
+                if (std::exchange(first, false)) {
+                    cancelled.set_value();
+                }
+            },
+            {});
+        EXPECT_EQ(ending.signal, signal);
+        EXPECT_FALSE(ending.timedOut);
+    }
+}
+
+TEST(CancellableRun, IsEndedAtOnceByASecondSignal) {
+    GTEST_FLAG_SET(death_test_style, "threadsafe");
+    EXPECT_EXIT(
+        {
+            CancellableRun run;
+            run.run(
+                [](const std::stop_token&) {
+                    kill(getpid(), SIGINT);
+                    while (true) {
+                        pause();
+                    }
+                },
+                [] { kill(getpid(), SIGTERM); }, {});
+        },
+        testing::ExitedWithCode(128 + SIGTERM), "");
+}
+
+}  // namespace
+}  // namespace raidinfo

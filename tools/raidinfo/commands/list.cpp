@@ -1,0 +1,85 @@
+#include <algorithm>
+#include <nlohmann/json.hpp>
+#include <string>
+#include <vector>
+
+#include "commands/commands.h"
+#include "exit_status.h"
+#include "json/json.h"
+#include "listing/listing.h"
+#include "presentation/table.h"
+
+namespace raidinfo {
+namespace {
+
+/// The kinds to list: the one asked for, or all that have the columns that filters look at.
+std::vector<const Kind*> kindsOf(const ListOptions& list) {
+    if (list.kind != nullptr) {
+        return {list.kind};
+    }
+    std::vector<const Kind*> kinds;
+    for (const Kind& kind : inventoryKinds()) {
+        if (std::ranges::all_of(list.filters,
+                                [&kind](const Filter& filter) { return concerns(filter, kind); })) {
+            kinds.push_back(&kind);
+        }
+    }
+    if (kinds.empty()) {
+        throw Failure{ExitStatus::usage, "no list has all the columns of the filters"};
+    }
+    return kinds;
+}
+
+/// People get the chief columns of a list that they name, programs everything; both what they ask
+/// for.
+ColumnChoice columnsOf(const ListOptions& list, bool json) {
+    if (list.columns) {
+        return *list.columns;
+    }
+    const bool everything = json || list.kind == nullptr;
+    return {.all = everything, .chief = !everything};
+}
+
+Listing chosen(const Kind& kind, const Trees& trees, const ListOptions& list, bool json) {
+    const auto columns = chosenColumns(columnsOf(list, json), kind);
+    return withColumns(filtered(listingOf(kind, trees.snapshot(), trees.adapters()), list.filters),
+                       columns);
+}
+
+}  // namespace
+
+int runCommand(const Session& session, const ListOptions& list) {
+    const std::vector<const Kind*> kinds = kindsOf(list);
+    const bool json = session.options().json;
+    for (const Kind* const kind : kinds) {
+        // What is wrong with the columns is said before anybody is asked.
+        static_cast<void>(chosenColumns(columnsOf(list, json), *kind));
+    }
+    const Trees trees = session.inventory();
+    auto lists = Json::object();
+    GridLayout layout = session.layout();
+    layout.headings = list.headings;
+    std::string text;
+    for (const Kind* const kind : kinds) {
+        const Listing listing = chosen(*kind, trees, list, json);
+        if (json) {
+            lists[std::string{kind->key}] = rowsJson(listing);
+        } else if (list.kind != nullptr) {
+            text = listing.rows.empty() && !list.headings
+                       ? ""
+                       : table(listing, layout, session.codeBook());
+        } else if (list.headings) {
+            text += (text.empty() ? "" : "\n") + titledTable(listing, layout, session.codeBook());
+        } else if (!listing.rows.empty()) {
+            text += table(listing, layout, session.codeBook());
+        }
+    }
+    if (json) {
+        session.print(std::move(lists));
+    } else {
+        session.output().write(text);
+    }
+    return 0;
+}
+
+}  // namespace raidinfo

@@ -1,0 +1,71 @@
+#include "commands/session.h"
+
+#include <unistd.h>
+
+#include <algorithm>
+#include <nlohmann/json.hpp>
+#include <utility>
+
+#include "inventory/structure.h"
+#include "presentation/text.h"
+#include "source/recorded.h"
+#include "source/service.h"
+
+namespace raidinfo {
+
+Trees::Trees(Inventory inventory)
+    : published{std::move(inventory.snapshot)},
+      roots{adapterTrees(inventory.adapters, published)} {}
+
+Session::Session(const Options& given, const Library& loaded, const Output& destination,
+                 std::stop_token stopped)
+    : chosen{given},
+      lib{loaded},
+      out{destination},
+      stopToken{std::move(stopped)},
+      screen{terminalOf(destination.descriptor(), given.color)} {
+    if (given.codes) {
+        book = readCodeBook(*given.codes);  // A wrong file is told before anybody is asked.
+    }
+    if (given.recording) {
+        answers = readRecording(*given.recording);
+    }
+}
+
+GridLayout Session::layout() const { return {.width = screen.width, .painter = painter()}; }
+
+Trees Session::inventory() const {
+    return Trees{answers ? recordedInventory(lib, *answers) : readInventory(lib, stopToken)};
+}
+
+const CodeBook& Session::codeBook() const {
+    if (!book) {
+        book = shippedCodeBook();
+    }
+    return *book;
+}
+
+void Session::print(Json data, const std::vector<Trouble>& troubles) const {
+    out.write(document(enveloped(sourceOf(chosen), troubles, std::move(data))));
+}
+
+void Session::printLine(const std::vector<Trouble>& troubles, Json data) const {
+    out.write(documentLine(enveloped(sourceOf(chosen), troubles, std::move(data))));
+}
+
+Source sourceOf(const Options& options) {
+    if (const auto* const diff = std::get_if<DiffOptions>(&options.command);
+        diff != nullptr && !diff->after.empty()) {
+        return {"files", diff->before + ", " + diff->after};
+    }
+    return options.recording ? Source{"recording", options.recording->string()}
+                             : Source{"service", "127.0.0.1:34572"};
+}
+
+void complain(std::string message) {
+    message = "raidinfo: " + printable(message) + "\n";
+    // Nothing can be done when this fails too.
+    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, message.data(), message.size());
+}
+
+}  // namespace raidinfo

@@ -1,0 +1,149 @@
+#include "doctor/examination.h"
+
+#include <arpa/inet.h>
+#include <dlfcn.h>
+#include <netinet/in.h>
+#include <sys/socket.h>
+#include <unistd.h>
+
+#include <array>
+#include <cerrno>
+#include <filesystem>
+#include <system_error>
+#include <utility>
+
+#include "doctor/library_log.h"
+#include "inventory/kinds.h"
+#include "system/alarm.h"
+#include "system/descriptor.h"
+
+namespace raidinfo {
+namespace {
+
+namespace fs = std::filesystem;
+using Outcome = Examined::Outcome;
+
+constexpr int port = 34572;
+constexpr int bitsOfAByte = 8;
+
+/// A file that the library looks for beside the working directory.
+std::string placeOf(const fs::path& name) {
+    std::error_code unknown;
+    const fs::path here = fs::current_path(unknown);
+    return unknown ? "nowhere: the working directory is gone"
+                   : (here / "../logs" / name).lexically_normal().string();
+}
+
+Examined loadedFile(const Library& library) {
+    Dl_info information{};
+    const std::string width = std::to_string(sizeof(void*) * bitsOfAByte) + " bits";
+    const bool known = dladdr(library.variable<int>("LOG_LEVEL"), &information) != 0 &&
+                       information.dli_fname != nullptr;
+    std::error_code unknown;
+    const fs::path file = known ? fs::canonical(information.dli_fname, unknown) : fs::path{};
+    return {"library", "Library", Outcome::fine,
+            (known && !unknown ? file.string() : "an unknown file") + ", " + width};
+}
+
+Examined settings(const Library& library) {
+    const int level = *library.variable<int>("LOG_LEVEL");
+    const std::string place = placeOf("RAIDInstrumentation.ini");
+    std::error_code unknown;
+    const bool there = fs::exists(place, unknown);
+    return {"settings", "Settings file", Outcome::fine,
+            place + (there ? "" : ", which is not there") + "; log level " + std::to_string(level)};
+}
+
+Examined log(const Library& library) {
+    const fs::path place = placeOf("RAIDInstrumentation.log");
+    const bool off = *library.variable<int>("LOG_LEVEL") == 0;
+    const bool writable = access(place.parent_path().c_str(), W_OK) == 0;
+    return {
+        "log", "Log file", off || writable ? Outcome::fine : Outcome::noteworthy,
+        place.string() + (off ? ", which is off"
+                              : (writable ? "" : ": " + std::generic_category().message(errno)))};
+}
+
+Examined listening() {
+    const Descriptor probe{socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0), "cannot make a socket"};
+    sockaddr_in address{};
+    address.sin_family = AF_INET;
+    address.sin_port = htons(port);
+    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
+    const std::string where = "127.0.0.1 port " + std::to_string(port);
+    // NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): how sockets take addresses
+    if (connect(probe.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0) {
+        return {"listening", "Service listens", Outcome::fine, where};
+    }
+    return {"listening", "Service listens", Outcome::bad,
+            "nothing on " + where + ": " + std::generic_category().message(errno),
+            ExitStatus::serviceUnavailable};
+}
+
+Examined answering(const Library& library) {
+    if (library.function<int()>("enableRAIDEvent")() == 0) {
+        return {"answering", "Service answers", Outcome::bad,
+                "it accepts connections and gives no answer", ExitStatus::serviceUnavailable};
+    }
+    const int newest = *library.variable<int>("nextSequenceNumber");
+    return {"answering", "Service answers", Outcome::fine,
+            "its newest event is " + std::to_string(newest)};
+}
+
+Examined wellFormed(const Library& library) {
+    const LibraryLog log{library};
+    library.function<int()>("RAIDinit")();
+    if (*library.variable<const void*>("raidSystem") != nullptr) {
+        return {"well_formed", "Configuration", Outcome::fine, "well-formed"};
+    }
+    const std::string message = log.lastError();
+    return {"well_formed", "Configuration", Outcome::bad,
+            message.empty() ? "no answer, or one that is not whole" : message,
+            ExitStatus::malformedAnswer};
+}
+
+Examined published(const Library& library) {
+    std::string counts;
+    int adapters = 0;
+    for (const Kind& kind : inventoryKinds()) {
+        const int count = library.function<int()>(kind.count)();
+        adapters += kind.id <= KindId::vantryAdapter ? count : 0;
+        if (count > 0) {
+            counts +=
+                (counts.empty() ? "" : ", ") + std::to_string(count) + " " + std::string{kind.key};
+        }
+    }
+    return {"published", "Lists", adapters > 0 ? Outcome::fine : Outcome::noteworthy,
+            (adapters > 0 ? "" : "no adapter; ") + (counts.empty() ? "all empty" : counts)};
+}
+
+}  // namespace
+
+std::string_view wordOf(Outcome outcome) noexcept {
+    constexpr auto words = std::to_array<std::string_view>({"ok", "look", "bad"});
+    return words.at(static_cast<std::size_t>(outcome));
+}
+
+void examine(const Library& library, std::optional<std::chrono::milliseconds> limit,
+             const std::function<void(const Examined&)>& tell) {
+    const auto toldIsBad = [&tell](const Examined& found) {
+        tell(found);
+        return found.outcome == Outcome::bad;
+    };
+    tell(loadedFile(library));
+    const Examined service = listening();
+    std::optional<Alarm> alarm;
+    if (limit) {
+        alarm.emplace(*limit, library.function<void()>("cancelGetEvent"));
+    }
+    // The library reads its settings with the first exchange.
+    const Examined answer = answering(library);
+    tell(settings(library));
+    tell(log(library));
+    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library))) {
+        return;
+    }
+    tell(published(library));
+}
+
+}  // namespace raidinfo

@@ -1,0 +1,47 @@
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <optional>
+#include <stop_token>
+#include <string>
+#include <string_view>
+
+#include "events/continuity.h"
+#include "inventory/records.h"
+#include "source/library.h"
+
+namespace raidinfo {
+
+/// The code of the notice that the service has begun to count its events anew.
+inline constexpr std::string_view numbersWentBack = "numbers_went_back";
+
+/// What is told of the stream besides its events.
+struct Notice {
+    std::string_view code;
+    std::string message;
+};
+
+/// Who is told. `show` returns false when it has seen enough.
+struct EventListener {
+    std::function<bool(const Record&)> show;
+    std::function<void(const Notice&)> notice;
+};
+
+/// Where the stream begins: at the service's newest event, at a number, or after the last number
+/// that an earlier run has shown.
+struct StreamStart {
+    std::optional<std::int64_t> first = std::nullopt;
+    std::optional<std::int64_t> shownBefore = std::nullopt;
+};
+
+/// Shows every event once until stop is requested or the listener has seen enough. A service that
+/// cannot be reached at first is a Failure; one that goes away later is waited for. Answers that
+/// are malformed again and again are a Failure, too.
+void followEvents(const Library& library, const StreamStart& start, const EventListener& listener,
+                  const std::stop_token& stop);
+
+/// Shows a batch; returns false when the listener has seen enough.
+bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener);
+
+}  // namespace raidinfo

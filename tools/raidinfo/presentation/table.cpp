@@ -1,0 +1,93 @@
+#include "presentation/table.h"
+
+#include <array>
+#include <utility>
+#include <vector>
+
+#include "overloaded.h"
+#include "presentation/text.h"
+
+namespace raidinfo {
+namespace {
+
+std::string joined(const std::vector<int>& numbers) {
+    std::string result;
+    for (const int number : numbers) {
+        result += (result.empty() ? "" : ",") + std::to_string(number);
+    }
+    return result;
+}
+
+bool isNumber(const Field& field) {
+    return field.shape == Shape::number || field.shape == Shape::constant;
+}
+
+bool holdsNumber(const Value& value) { return std::holds_alternative<int>(value); }
+
+/// Numbers are, but not those with a name behind them.
+bool isToTheRight(const ListColumn& column, const Listing& listing, std::size_t index,
+                  const CodeBook::Meaning* meaning) {
+    return column.field == nullptr
+               ? !listing.rows.empty() && holdsNumber(listing.rows.front()[index])
+               : isNumber(*column.field) &&
+                     (meaning == nullptr || !std::holds_alternative<CodeBook::Codes>(*meaning));
+}
+
+}  // namespace
+
+std::string shown(const Value& value) {
+    return std::visit(
+        Overloaded{[](int number) { return std::to_string(number); },
+                   [](bool flag) { return std::string{flag ? "yes" : "no"}; },
+                   [](const std::string& text) { return text.empty() ? "-" : printable(text); },
+                   [](UnknownStatus) { return std::string{"unknown"}; },
+                   [](const std::vector<int>& numbers) {
+                       return numbers.empty() ? "-" : joined(numbers);
+                   }},
+        value);
+}
+
+std::string shown(const Kind& kind, const Field& field, const Value& value, const CodeBook& book) {
+    return isNumber(field) ? book.shown(kind.key, field.key, value) : shown(value);
+}
+
+Style styleOf(const Value& value, const Field* field) {
+    constexpr auto words = std::to_array<std::pair<std::string_view, Style>>(
+        {{"Normal", Style::good}, {"Warning", Style::warning}, {"Critical", Style::critical}});
+    if (field == nullptr || field->shape != Shape::statusText) {
+        return Style::plain;
+    }
+    if (const auto* const text = std::get_if<std::string>(&value)) {
+        for (const auto& [word, style] : words) {
+            if (*text == word) {
+                return style;
+            }
+        }
+    }
+    return Style::unknown;
+}
+
+std::string table(const Listing& listing, const GridLayout& layout, const CodeBook& book) {
+    std::vector<GridColumn> columns;
+    columns.reserve(listing.columns.size());
+    for (std::size_t index = 0; index < listing.columns.size(); ++index) {
+        const ListColumn& listed = listing.columns[index];
+        const CodeBook::Meaning* const meaning =
+            listed.field == nullptr ? nullptr : book.find(listing.kind->key, listed.field->key);
+        GridColumn& column = columns.emplace_back(GridColumn{
+            std::string{listed.title}, isToTheRight(listed, listing, index, meaning), {}});
+        column.cells.reserve(listing.rows.size());
+        for (const std::vector<Value>& row : listing.rows) {
+            column.cells.push_back({shown(row[index], meaning), styleOf(row[index], listed.field)});
+        }
+    }
+    return drawn(columns, layout);
+}
+
+std::string titledTable(const Listing& listing, const GridLayout& layout, const CodeBook& book) {
+    const std::string title =
+        std::string{listing.kind->plural} + ": " + std::to_string(listing.rows.size()) + "\n";
+    return listing.rows.empty() ? title : title + table(listing, layout, book);
+}
+
+}  // namespace raidinfo

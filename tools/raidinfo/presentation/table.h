@@ -1,0 +1,30 @@
+#pragma once
+
+#include <string>
+
+#include "codebook/code_book.h"
+#include "inventory/records.h"
+#include "listing/listing.h"
+#include "presentation/grid.h"
+
+namespace raidinfo {
+
+/// A value as people read it.
+[[nodiscard]] std::string shown(const Value& value);
+
+/// The value of a kind's field, with what it means beside a code or a size.
+[[nodiscard]] std::string shown(const Kind& kind, const Field& field, const Value& value,
+                                const CodeBook& book);
+
+/// The look of a value of a field, by what it says.
+[[nodiscard]] Style styleOf(const Value& value, const Field* field);
+
+/// The rows of a listing as a grid: numbers to the right, everything else to the left.
+[[nodiscard]] std::string table(const Listing& listing, const GridLayout& layout,
+                                const CodeBook& book);
+
+/// The same below the title of the kind and the number of rows; no grid if there are none.
+[[nodiscard]] std::string titledTable(const Listing& listing, const GridLayout& layout,
+                                      const CodeBook& book);
+
+}  // namespace raidinfo

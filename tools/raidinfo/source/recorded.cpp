@@ -1,0 +1,96 @@
+#include "source/recorded.h"
+
+#include <fcntl.h>
+#include <sys/resource.h>
+#include <unistd.h>
+
+#include <optional>
+#include <string>
+
+#include "exit_status.h"
+#include "source/service_failures.h"
+#include "system/file.h"
+#include "system/memory_file.h"
+
+namespace raidinfo {
+namespace {
+
+using recording::Question;
+
+/// While it lives the process gets no new descriptor, so that the library gets no socket: it then
+/// publishes what it has read from a saved answer instead of asking a service that may be running.
+class NoExchange {
+public:
+    NoExchange() {
+        getrlimit(RLIMIT_NOFILE, &before);
+        const Descriptor lowestFree{fcntl(STDIN_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1),
+                                    "cannot find a free descriptor"};
+        rlimit none = before;
+        none.rlim_cur = static_cast<rlim_t>(lowestFree.get());
+        setrlimit(RLIMIT_NOFILE, &none);
+    }
+    NoExchange(const NoExchange&) = delete;
+    NoExchange& operator=(const NoExchange&) = delete;
+    ~NoExchange() { setrlimit(RLIMIT_NOFILE, &before); }
+
+private:
+    rlimit before{};
+};
+
+// Functions of the library that take a std::string: their names in the exported list.
+constexpr auto readConfiguration =
+    "_Z11readRAIDXMLNSt7__cxx1112basic_stringIcSt11char_traitsIcESaIcEEE";
+constexpr auto readEvents =
+    "_Z16readEventRAIDXMLNSt7__cxx1112basic_stringIcSt11char_traitsIcESaIcEEE";
+
+void readSaved(const Library& library, const char* function, const std::string& body) {
+    const MemoryFile file{body};
+    library.function<int(std::string)>(function)(file.path());
+}
+
+void callWithoutExchange(const Library& library, const char* function) {
+    const NoExchange guard;
+    library.function<int()>(function)();
+}
+
+}  // namespace
+
+recording::Recording readRecording(const std::filesystem::path& path) {
+    const std::string text = readFile(path);
+    try {
+        return recording::parse(text);
+    } catch (const recording::RecordingError& error) {
+        throw Failure{ExitStatus::badInput, path.string() + ": " + error.what()};
+    }
+}
+
+Inventory recordedInventory(const Library& library, const recording::Recording& recorded) {
+    const std::optional<std::string>* last = nullptr;
+    for (const recording::Entry& entry : recorded.entries) {
+        if (entry.question == Question::configuration) {
+            last = &entry.body;
+        }
+    }
+    if (last == nullptr || !*last) {
+        throw Failure{ExitStatus::serviceUnavailable, "the recording holds no configuration"};
+    }
+    readSaved(library, readConfiguration, **last);
+    const RAIDSystem* const system = *library.variable<const RAIDSystem*>("raidSystem");
+    if (system == nullptr) {
+        throw malformedAnswer();
+    }
+    callWithoutExchange(library, "RAIDinit");
+    return {RecordReader{library}.readInventory(), system->getAdapters()};
+}
+
+std::optional<Records> eventsIn(const Library& library, RecordReader& reader,
+                                const std::string& body) {
+    readSaved(library, readEvents, body);
+    if (*library.variable<const void*>("raidEvents") == nullptr) {
+        return std::nullopt;
+    }
+    callWithoutExchange(library, "getEvent");
+    return reader.read(eventKind());
+}
+
+}  // namespace raidinfo

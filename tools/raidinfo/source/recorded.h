@@ -1,0 +1,26 @@
+#pragma once
+
+#include <filesystem>
+#include <optional>
+#include <string>
+
+#include "recording/recording.h"
+#include "source/inventory.h"
+#include "source/library.h"
+
+namespace raidinfo {
+
+/// Reads the file; Failures where it cannot be read or is no recording.
+[[nodiscard]] recording::Recording readRecording(const std::filesystem::path& path);
+
+/// The inventory by the recording's last configuration. Fails as if the service had answered now:
+/// with serviceUnavailable where there is no answer, with malformedAnswer where the library cannot
+/// read it.
+[[nodiscard]] Inventory recordedInventory(const Library& library,
+                                          const recording::Recording& recorded);
+
+/// The events of an answer's body; nothing where the library cannot read it.
+[[nodiscard]] std::optional<Records> eventsIn(const Library& library, RecordReader& reader,
+                                              const std::string& body);
+
+}  // namespace raidinfo

@@ -1,0 +1,23 @@
+#pragma once
+
+#include <chrono>
+#include <functional>
+#include <optional>
+#include <stop_token>
+
+#include "recording/recording.h"
+#include "source/library.h"
+
+namespace raidinfo {
+
+/// Where the recorder puts what it gets.
+using EntrySink = std::function<void(const recording::Entry&)>;
+
+/// Asks for the configuration and the events and then, at each new event, again, and hands over
+/// every answer as it came, until stop is requested or the duration is over; a duration of 0 asks
+/// once. A service that cannot be reached at first is a Failure; one that goes away is waited for,
+/// and recorded as gone.
+void recordAnswers(const Library& library, const EntrySink& sink,
+                   std::optional<std::chrono::seconds> duration, const std::stop_token& stop);
+
+}  // namespace raidinfo

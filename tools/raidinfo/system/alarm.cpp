@@ -1,0 +1,22 @@
+#include "system/alarm.h"
+
+#include <stop_token>
+#include <utility>
+
+#include "system/backoff.h"
+#include "system/cancellable.h"
+
+namespace raidinfo {
+
+Alarm::Alarm(std::chrono::milliseconds after, std::function<void()> cancel)
+    : clock{[after, cancel = std::move(cancel),
+             waiting = pthread_self()](const std::stop_token& stop) {
+          pauseUnlessStopped(after, stop);
+          while (!stop.stop_requested()) {
+              cancel();
+              wake(waiting);
+              pauseUnlessStopped(cancelInterval, stop);
+          }
+      }} {}
+
+}  // namespace raidinfo

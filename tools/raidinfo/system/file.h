@@ -1,0 +1,32 @@
+#pragma once
+
+#include <filesystem>
+#include <string>
+#include <string_view>
+
+#include "system/descriptor.h"
+
+namespace raidinfo {
+
+/// The whole file; one that cannot be read is a noInput Failure.
+[[nodiscard]] std::string readFile(const std::filesystem::path& path);
+
+/// Writes the file beside its place and then moves it there, so that nobody ever sees half of it.
+/// What cannot be written is a cannotCreate Failure.
+void replaceFile(const std::filesystem::path& path, std::string_view content);
+
+/// A new file that is good after every piece that is appended. What cannot be written is a
+/// cannotCreate Failure.
+class GrowingFile {
+public:
+    /// Replaces a file that is there.
+    explicit GrowingFile(std::filesystem::path path);
+
+    void append(std::string_view piece) const;
+
+private:
+    std::filesystem::path name;
+    Descriptor file;
+};
+
+}  // namespace raidinfo

@@ -1,0 +1,48 @@
+#include "system/output.h"
+
+#include <fcntl.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstddef>
+#include <system_error>
+
+#include "exit_status.h"
+
+namespace raidinfo {
+namespace {
+
+Failure failure() {
+    return {ExitStatus::outputFailed,
+            "cannot write the output: " + std::generic_category().message(errno)};
+}
+
+int copyOfStandardOutput() {
+    const int copy = fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
+    if (copy < 0) {
+        throw failure();
+    }
+    return copy;
+}
+
+}  // namespace
+
+Output::Output() : original{copyOfStandardOutput(), "standard output"} {
+    const Descriptor null{open("/dev/null", O_WRONLY | O_CLOEXEC), "cannot open /dev/null"};
+    if (dup2(null.get(), STDOUT_FILENO) < 0) {
+        throw failure();
+    }
+}
+
+void Output::write(std::string_view text) const {
+    while (!text.empty()) {
+        const ssize_t written = ::write(original.get(), text.data(), text.size());
+        if (written >= 0) {
+            text.remove_prefix(static_cast<std::size_t>(written));
+        } else if (errno != EINTR) {
+            throw failure();
+        }
+    }
+}
+
+}  // namespace raidinfo

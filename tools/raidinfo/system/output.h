@@ -1,0 +1,24 @@
+#pragma once
+
+#include <string_view>
+
+#include "system/descriptor.h"
+
+namespace raidinfo {
+
+/// The program's standard output, kept clean: the library prints a line per exchange on descriptor
+/// 1, so that one is pointed at the null device and the program writes to a copy of the original.
+class Output {
+public:
+    Output();
+
+    /// Writes all of the text, or fails with the reason.
+    void write(std::string_view text) const;
+
+    [[nodiscard]] int descriptor() const noexcept { return original.get(); }
+
+private:
+    Descriptor original;
+};
+
+}  // namespace raidinfo

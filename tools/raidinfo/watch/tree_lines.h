@@ -1,0 +1,32 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "presentation/tree.h"
+#include "watch/screen.h"
+
+namespace raidinfo {
+
+/// A line of the watched tree.
+struct TreeLine {
+    enum class Change : std::uint8_t { none, changed, gone };
+
+    std::string path;    ///< the titles down to it, by which the line is known again
+    std::string margin;  ///< what joins it to the lines above
+    std::string text;
+    Change change = Change::none;
+};
+
+[[nodiscard]] std::vector<TreeLine> treeLines(const Group& roots, const CodeBook& book);
+
+/// Marks what is new or reads otherwise than before, and adds what is gone as lines at the end.
+/// Returns whether there is any. Nothing is marked the first time, when there is no line before.
+bool markChanges(std::vector<TreeLine>& now, const std::vector<TreeLine>& before);
+
+/// The lines as people see them: with "* " before what changed and "- " before what is gone, also
+/// without colours.
+[[nodiscard]] std::vector<ScreenLine> drawnLines(const std::vector<TreeLine>& lines);
+
+}  // namespace raidinfo
