@@ -7,8 +7,8 @@ cd "$root" || exit
 jobs=$(nproc)
 # Python leaves no compiled files in the tree.
 export PYTHONDONTWRITEBYTECODE=1
-buildPackages=(cmake g++ libboost-dev libcli11-dev libtomlplusplus-dev ninja-build nlohmann-json3-dev)
-testPackages=(g++-multilib googletest mypy pkgconf python3-jsonschema python3-pip python3-pytest python3-setuptools python3-wheel)
+buildPackages=(cmake g++ libboost-dev libcli11-dev libtomlplusplus-dev ninja-build nlohmann-json3-dev scdoc)
+testPackages=(g++-multilib googletest groff-base mypy pkgconf python3-jsonschema python3-pip python3-pytest python3-setuptools python3-wheel)
 benchPackages=(g++-multilib libbenchmark-dev libexpat1-dev libpugixml-dev librapidxml-dev libxml2-dev python3)
 checkPackages=(black clang clang-format clang-tidy mypy python3-pytest shellcheck)
 abiPackages=(abigail-tools)
