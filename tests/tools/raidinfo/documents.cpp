@@ -82,18 +82,28 @@ std::string sampleAdapter() {
                         channel(2, drive(2, 0) + enclosure(2, 14, 2))));
 }
 
-std::string eventBatch(const std::vector<int>& numbers) {
+namespace {
+
+std::string batchOf(const std::vector<int>& numbers, const std::string& message) {
     std::string events;
     for (const int number : numbers) {
         events += complex("event", "o:Event",
                           simple({{"sequenceNumber", std::to_string(number)},
                                   {"date", "2006-10-02"},
                                   {"type", "Warning"},
-                                  {"string", "event " + std::to_string(number)},
+                                  {"string", message + " " + std::to_string(number)},
                                   {"channel", "1"},
                                   {"deviceID", "3"}}));
     }
     return raid::test::eventsDocument(complex("events", "o:Events", events));
+}
+
+}  // namespace
+
+std::string eventBatch(const std::vector<int>& numbers) { return batchOf(numbers, "event"); }
+
+std::string otherEventBatch(const std::vector<int>& numbers) {
+    return batchOf(numbers, "other event");
 }
 
 }  // namespace raidinfo::test

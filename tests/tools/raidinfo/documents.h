@@ -24,4 +24,7 @@ using Fields = std::vector<std::pair<std::string, std::string>>;
 // An answer with an event for each number, its message "event <number>".
 [[nodiscard]] std::string eventBatch(const std::vector<int>& numbers);
 
+// The same with other messages: the events of a service that has begun to count anew.
+[[nodiscard]] std::string otherEventBatch(const std::vector<int>& numbers);
+
 }  // namespace raidinfo::test

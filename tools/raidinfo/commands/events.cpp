@@ -1,5 +1,6 @@
-#include <algorithm>
+#include <cstdint>
 #include <nlohmann/json.hpp>
+#include <optional>
 #include <string>
 
 #include "commands/commands.h"
@@ -32,15 +33,14 @@ public:
             }
         }
         if (options.state) {
-            greatest = std::max(greatest, numberOf(eventKind(), event, "sequence_number"));
-            StateFile{*options.state}.write(greatest);
+            keep(event);
         }
         return ++shown != options.count;
     }
 
     void notice(const Notice& notice) {
         if (notice.code == numbersWentBack) {
-            greatest = 0;
+            last.reset();
         }
         complain(notice.message);
         if (session.options().json) {
@@ -49,6 +49,15 @@ public:
     }
 
 private:
+    /// An event that comes late leaves the state alone.
+    void keep(const Record& event) {
+        const std::int64_t number = numberOf(eventKind(), event, "sequence_number");
+        if (!last || number >= last->number) {
+            last = LastShown{number, contentOf(event)};
+            StateFile{*options.state}.write(*last);
+        }
+    }
+
     void runHookFor(const Record& event) {
         const std::string input =
             documentLine(enveloped(sourceOf(session.options()), {}, eventJson(event)));
@@ -61,13 +70,20 @@ private:
     const Session& session;
     const EventsOptions& options;
     int shown = 0;
-    int greatest = 0;  ///< number shown since the service began to count
+    std::optional<LastShown> last;  ///< with the greatest number since the service began to count
 };
 
+/// What cannot be kept is told before the first event is handed to anybody.
 StreamStart startOf(const EventsOptions& options) {
     StreamStart start{.first = options.since};
     if (options.state) {
-        start.shownBefore = StateFile{*options.state}.read();
+        const StateFile state{*options.state};
+        start.shownBefore = state.read();
+        if (start.shownBefore) {
+            state.write(*start.shownBefore);
+        } else {
+            state.tryToWrite();
+        }
     }
     return start;
 }
@@ -80,10 +96,9 @@ void showRecorded(const Session& session, const StreamStart& start, const EventL
         if (entry.question != recording::Question::events || !entry.body) {
             continue;
         }
-        if (const auto batch = eventsIn(session.library(), reader, *entry.body)) {
-            if (!showBatch(continuity, *batch, listener)) {
-                return;
-            }
+        const auto batch = eventsIn(session.library(), reader, *entry.body);
+        if (batch && !showBatch(continuity, *batch, listener)) {
+            return;
         }
     }
 }

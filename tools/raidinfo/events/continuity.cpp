@@ -1,12 +1,12 @@
 #include "events/continuity.h"
 
 #include <algorithm>
-#include <functional>
+#include <iterator>
+#include <numeric>
 #include <set>
-#include <string>
 #include <string_view>
 
-#include "presentation/table.h"
+#include "overloaded.h"
 
 namespace raidinfo {
 namespace {
@@ -14,38 +14,66 @@ namespace {
 /// As many events are known by their content, and as many gaps may still be filled.
 constexpr std::size_t memory = 10'000;
 
+/// The library asks for 101 numbers at once. If it begins so far below the last one shown, there is
+/// still one ahead among them.
+constexpr std::int64_t overlap = 99;
+
 std::int64_t numberOf(const Record& event) {
     return raidinfo::numberOf(eventKind(), event, "sequence_number");
 }
 
-std::size_t contentHash(const Record& event) {
-    std::string content;
-    for (const Value& value : event) {
-        content += shown(value) + '\n';
+/// FNV-1a.
+class Fingerprint {
+public:
+    void add(std::string_view bytes) {
+        for (const char byte : bytes) {
+            value = (value ^ static_cast<unsigned char>(byte)) * 0x100000001b3U;
+        }
+        value = (value ^ 0xFFU) * 0x100000001b3U;  // ends the field
     }
-    return std::hash<std::string>{}(content);
-}
+    [[nodiscard]] std::uint64_t result() const noexcept { return value; }
+
+private:
+    std::uint64_t value = 0xcbf29ce484222325U;
+};
 
 }  // namespace
 
-Continuity Continuity::after(std::int64_t last) {
-    Continuity continuity{last + 1};
-    continuity.greatest = last;
+std::uint64_t contentOf(const Record& event) {
+    Fingerprint fingerprint;
+    for (const Value& field : event) {
+        std::visit(Overloaded{[&](int number) { fingerprint.add(std::to_string(number)); },
+                              [&](const std::string& text) { fingerprint.add(text); },
+                              [](const auto&) {}},  // no event has other fields
+                   field);
+    }
+    return fingerprint.result();
+}
+
+Continuity Continuity::after(const LastShown& last) {
+    Continuity continuity{last.number + 1};
+    continuity.greatest = last.number;
+    if (last.content) {
+        continuity.remember(last.number, *last.content);
+    }
     return continuity;
 }
 
 Continuity::Accepted Continuity::accept(const Records& batch) {
+    std::vector<std::size_t> places(batch.size());
+    std::iota(places.begin(), places.end(), std::size_t{0});
+    std::ranges::stable_sort(places, {}, [&](std::size_t place) { return numberOf(batch[place]); });
     Accepted accepted;
     std::set<std::int64_t> ahead;
-    for (std::size_t place = 0; place < batch.size(); ++place) {
+    for (const std::size_t place : places) {
         const std::int64_t number = numberOf(batch[place]);
-        const bool isAhead = number >= expected;
-        if (isAhead ? !ahead.insert(number).second : !takeFromMissing(number)) {
-            continue;
+        const std::uint64_t content = contentOf(batch[place]);
+        if (number >= expected) {
+            ahead.insert(number);
         }
-        if (!wasShown(number, batch[place])) {
+        if (isFresh(number, content)) {
             accepted.fresh.push_back(place);
-            remember(number, batch[place]);
+            remember(number, content);
         }
     }
     std::int64_t awaited = expected == 0 && !ahead.empty() ? *ahead.begin() : expected;
@@ -66,20 +94,50 @@ Continuity::Accepted Continuity::accept(const Records& batch) {
     return accepted;
 }
 
-bool Continuity::beganAnew(std::int64_t newest) {
-    if (!greatest || newest >= *greatest) {
-        return false;
+Continuity::History Continuity::compared(const Records& batch) const {
+    History history = History::unknown;
+    for (const Record& event : batch) {
+        const auto found = shown.find(numberOf(event));
+        if (found != shown.end()) {
+            if (found->second != contentOf(event)) {
+                return History::different;
+            }
+            history = History::same;
+        }
     }
+    return history;
+}
+
+void Continuity::beginAnew() {
     expected = 0;
     asked = 0;
     greatest.reset();
     missingUntil.clear();
-    return true;
 }
 
-bool Continuity::wasShown(std::int64_t number, const Record& event) const {
+void Continuity::shrinkTo(std::int64_t number) {
+    expected = number + 1;
+    asked = 0;
+    greatest = number;
+}
+
+std::int64_t Continuity::next() const noexcept { return std::max(expected, asked); }
+
+std::int64_t Continuity::overlapping() const {
+    if (!greatest || asked > expected) {
+        return next();
+    }
+    const auto recent = missingUntil.lower_bound(*greatest - overlap);
+    return recent == missingUntil.end() ? *greatest : std::min(recent->first, *greatest);
+}
+
+/// An event with the number of another one that was shown is new when it says something else.
+bool Continuity::isFresh(std::int64_t number, std::uint64_t content) {
     const auto found = shown.find(number);
-    return found != shown.end() && found->second == contentHash(event);
+    if (found != shown.end()) {
+        return found->second != content;
+    }
+    return number >= expected || takeFromMissing(number);
 }
 
 bool Continuity::takeFromMissing(std::int64_t number) {
@@ -98,8 +156,8 @@ bool Continuity::takeFromMissing(std::int64_t number) {
     return true;
 }
 
-void Continuity::remember(std::int64_t number, const Record& event) {
-    if (shown.insert_or_assign(number, contentHash(event)).second) {
+void Continuity::remember(std::int64_t number, std::uint64_t content) {
+    if (shown.insert_or_assign(number, content).second) {
         order.push_back(number);
     }
     if (order.size() > memory) {

@@ -23,12 +23,21 @@ std::string told(const MissingNumbers& missing) {
                                                std::to_string(missing.last) + " are missing";
 }
 
+std::int64_t greatestIn(const Records& events) {
+    std::int64_t greatest = 0;
+    for (const Record& event : events) {
+        greatest =
+            std::max<std::int64_t>(greatest, numberOf(eventKind(), event, "sequence_number"));
+    }
+    return greatest;
+}
+
 class Follower {
 public:
     Follower(const Library& library, const StreamStart& start, const EventListener& told)
         : reader{library},
           askNewest{library.function<int()>("enableRAIDEvent")},
-          newest{library.variable<int>("nextSequenceNumber")},
+          nextNumber{library.variable<int>("nextSequenceNumber")},
           setNext{library.function<void(int)>("setRAIDEventSequenceNumber")},
           waitForEvents{library.function<int()>("getEvent")},
           batch{library.variable<const void*>("raidEvents")},
@@ -40,25 +49,18 @@ public:
         if (!isServiceThere(stop)) {
             return true;
         }
-        const std::int64_t next = continuity->next();
-        const std::int64_t newestBefore = *newest;
-        setNext(static_cast<int>(std::min<std::int64_t>(next, std::numeric_limits<int>::max())));
-        waitForEvents();
-        if (stop.stop_requested()) {
+        const auto last = continuity->last();
+        const bool wentBack = last && newest < *last && newest != trusted;
+        const bool isAhead = last && (newest > *last || mayBeLate);
+        const std::int64_t from =
+            wentBack ? newest : (isAhead ? continuity->overlapping() : continuity->next());
+        mayBeLate = false;
+        const Records records = readFrom(from, stop);
+        if (stop.stop_requested() ||
+            (last && from <= *last && !isContinued(records, wentBack, *last))) {
             return true;
         }
-        const Records records = reader.read(eventKind());
-        const auto before = continuity->last();
-        const bool more = showBatch(*continuity, records, listener);
-        if (continuity->last() != before) {
-            failedReads = 0;
-            backoff.reset();
-        } else if (*batch != nullptr && records.empty() && newestBefore >= next + numbersAsked) {
-            continuity->passOverTo(next + numbersAsked);
-        } else {
-            examineReadOfNothing(stop);
-        }
-        return more;
+        return show(records, from, stop);
     }
 
 private:
@@ -70,21 +72,16 @@ private:
             }
             return false;
         }
+        newest = *nextNumber;
         if (!continuity) {
             continuity = beginning.shownBefore ? Continuity::after(*beginning.shownBefore)
-                                               : Continuity{beginning.first.value_or(*newest)};
+                                               : Continuity{beginning.first.value_or(newest)};
         }
         if (isAway) {
             isAway = false;
+            trusted = -1;
             backoff.reset();
             listener.notice({"service_available", "the RAID management service answers again"});
-        }
-        const auto last = continuity->last();
-        if (continuity->beganAnew(*newest)) {
-            listener.notice({numbersWentBack, "the service's newest event is " +
-                                                  std::to_string(*newest) + " after " +
-                                                  std::to_string(*last) +
-                                                  "; it has begun to count anew"});
         }
         return true;
     }
@@ -101,6 +98,73 @@ private:
         backoff.wait(stop);
     }
 
+    Records readFrom(std::int64_t number, const std::stop_token& stop) {
+        emptinessIsNew = *batch == nullptr || published > 0;
+        setNext(static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max())));
+        waitForEvents();
+        Records records = stop.stop_requested() ? Records{} : reader.read(eventKind());
+        published = records.size();
+        return records;
+    }
+
+    /// Looks whether the service still tells of the events that were shown; if not, it has begun to
+    /// count anew, and what it has is asked for from the beginning.
+    bool isContinued(const Records& records, bool wentBack, std::int64_t last) {
+        using History = Continuity::History;
+        const History history = continuity->compared(records);
+        if (history == History::different ||
+            (wentBack && history == History::unknown && !records.empty())) {
+            listener.notice(
+                {numbersWentBack, "the service no longer has the events that it had up to " +
+                                      std::to_string(last) + "; it has begun to count anew"});
+            continuity->beginAnew();
+            return false;
+        }
+        if (wentBack && history == History::same) {
+            const std::int64_t greatest = greatestIn(records);
+            if (greatest < last) {
+                continuity->shrinkTo(greatest);
+            } else {
+                trusted = newest;  // The events are only in disorder.
+            }
+        }
+        return true;
+    }
+
+    bool show(const Records& records, std::int64_t from, const std::stop_token& stop) {
+        const std::int64_t before = continuity->next();
+        bool anyFresh = false;
+        const EventListener watched{[&](const Record& event) {
+                                        anyFresh = true;
+                                        return listener.show(event);
+                                    },
+                                    listener.notice};
+        const bool more = showBatch(*continuity, records, watched);
+        const std::int64_t behind = from + numbersAsked;
+        if (anyFresh) {
+            failedReads = 0;
+            backoff.reset();
+            mayBeLate = continuity->waitsForLateEvents();
+        } else if (continuity->next() > before) {
+            failedReads = 0;  // Shown before the service lost them, and now there again.
+        } else if (newest >= behind && records.empty() && *batch != nullptr) {
+            passOver(behind, stop);
+        } else {
+            examineReadOfNothing(stop);
+        }
+        return more;
+    }
+
+    /// The range that was read holds nothing, if it was read: a wait that fails publishes what was
+    /// published before. Where that was nothing, too, something is read and then the range again.
+    void passOver(std::int64_t behind, const std::stop_token& stop) {
+        if (emptinessIsNew) {
+            continuity->passOverTo(behind);
+        } else if (readFrom(newest, stop).empty()) {
+            examineReadOfNothing(stop);
+        }
+    }
+
     /// Fails if nothing new comes because of malformed answers; an empty batch is none.
     void examineReadOfNothing(const std::stop_token& stop) {
         failedReads = *batch == nullptr ? failedReads + 1 : 0;
@@ -112,7 +176,7 @@ private:
 
     RecordReader reader;
     int (*askNewest)();
-    const int* newest;  ///< the library's next number, which askNewest sets to the newest
+    const int* nextNumber;  ///< the library's, which askNewest sets to the newest
     void (*setNext)(int);
     int (*waitForEvents)();
     const void* const* batch;  ///< the library's: null after a malformed answer
@@ -120,6 +184,11 @@ private:
     StreamStart beginning;
     std::optional<Continuity> continuity;  ///< from the first answer on
     Backoff backoff;
+    std::int64_t newest = 0;     ///< when the service was asked last
+    std::int64_t trusted = -1;   ///< a newest number below the last shown that means nothing
+    bool mayBeLate = false;      ///< a look for events that are missing is due
+    std::size_t published = 0;   ///< by the library, after the last read
+    bool emptinessIsNew = true;  ///< an empty batch would not be what was there before the read
     int failedReads = 0;
     bool isAway = false;
 };

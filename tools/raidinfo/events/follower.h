@@ -32,7 +32,7 @@ struct EventListener {
 /// that an earlier run has shown.
 struct StreamStart {
     std::optional<std::int64_t> first = std::nullopt;
-    std::optional<std::int64_t> shownBefore = std::nullopt;
+    std::optional<LastShown> shownBefore = std::nullopt;
 };
 
 /// Shows every event once until stop is requested or the listener has seen enough. A service that

@@ -14,7 +14,9 @@
 namespace raidinfo {
 namespace {
 
-/// What a child starts with: this input, and no signal blocked or ignored that this program blocks.
+/// What a child starts with: this input, no signal blocked that this program blocks, and a process
+/// group of its own, so that Ctrl-C is this program's to answer and reaches all that the shell has
+/// started.
 class Beginnings {
 public:
     explicit Beginnings(const MemoryFile& input) {
@@ -26,7 +28,8 @@ public:
         sigset_t none;
         sigemptyset(&none);
         posix_spawnattr_setsigmask(&attributes, &none);
-        posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSIGMASK);
+        posix_spawnattr_setpgroup(&attributes, 0);
+        posix_spawnattr_setflags(&attributes, POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETPGROUP);
     }
     Beginnings(const Beginnings&) = delete;
     Beginnings& operator=(const Beginnings&) = delete;
@@ -50,7 +53,7 @@ private:
 
 int endOf(pid_t child, const std::stop_token& stop) {
     {
-        const std::stop_callback terminate{stop, [child] { kill(child, SIGTERM); }};
+        const std::stop_callback terminate{stop, [child] { kill(-child, SIGTERM); }};
         // Its number stays its own until it is waited for below.
         siginfo_t information{};
         while (waitid(P_PID, static_cast<id_t>(child), &information, WEXITED | WNOWAIT) < 0 &&

@@ -1,7 +1,10 @@
 #include "events/state_file.h"
 
+#include <array>
 #include <charconv>
+#include <cstdint>
 #include <string>
+#include <string_view>
 #include <system_error>
 #include <utility>
 
@@ -9,26 +12,51 @@
 #include "system/file.h"
 
 namespace raidinfo {
+namespace {
+
+constexpr int base = 16;  // of the number for the content
+
+}  // namespace
 
 StateFile::StateFile(std::filesystem::path file) : path{std::move(file)} {}
 
-std::optional<std::int64_t> StateFile::read() const {
+std::optional<LastShown> StateFile::read() const {
     std::error_code unknown;
     if (!std::filesystem::exists(path, unknown) && !unknown) {
         return std::nullopt;
     }
     const std::string text = readFile(path);
-    std::int64_t number = 0;
-    const auto [stop, error] = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (error != std::errc{} || std::string_view{stop} != "\n" || number < 0) {
+    const char* const end = text.data() + text.size();
+    LastShown last{-1};
+    const auto [behindNumber, noNumber] = std::from_chars(text.data(), end, last.number);
+    const char* behind = behindNumber;
+    if (behind != end && *behind == ' ') {
+        std::uint64_t content = 0;
+        const auto [behindContent, noContent] = std::from_chars(behind + 1, end, content, base);
+        behind = noContent == std::errc{} ? behindContent : end;
+        last.content = content;
+    }
+    if (noNumber != std::errc{} || std::string_view(behind, end) != "\n" || last.number < 0) {
         throw Failure{ExitStatus::badInput,
                       path.string() + " does not hold the number of an event"};
     }
-    return number;
+    return last;
 }
 
-void StateFile::write(std::int64_t number) const {
-    replaceFile(path, std::to_string(number) + "\n");
+void StateFile::write(const LastShown& last) const {
+    std::string line = std::to_string(last.number);
+    if (last.content) {
+        std::array<char, 16> digits{};
+        const auto end =
+            std::to_chars(digits.data(), digits.data() + digits.size(), *last.content, base).ptr;
+        line += " " + std::string(digits.data(), end);
+    }
+    replaceFile(path, line + "\n");
+}
+
+void StateFile::tryToWrite() const {
+    write({0});
+    std::filesystem::remove(path);
 }
 
 }  // namespace raidinfo

@@ -1,21 +1,26 @@
 #pragma once
 
-#include <cstdint>
 #include <filesystem>
 #include <optional>
 
+#include "events/continuity.h"
+
 namespace raidinfo {
 
-/// The file in which `events` keeps the last number that it has shown.
+/// The file in which `events` keeps the last event that it has shown: its number, and what
+/// identifies its content.
 class StateFile {
 public:
     explicit StateFile(std::filesystem::path file);
 
-    /// Nothing if there is no file yet. A file with anything but a number is a Failure.
-    [[nodiscard]] std::optional<std::int64_t> read() const;
+    /// Nothing if there is no file yet. A file with anything else is a Failure.
+    [[nodiscard]] std::optional<LastShown> read() const;
 
-    /// Replaces the file in one step, so that whatever happens it holds the old number or the new.
-    void write(std::int64_t number) const;
+    /// Replaces the file in one step, so that whatever happens it holds the old event or the new.
+    void write(const LastShown& last) const;
+
+    /// Fails as write does, and leaves no file.
+    void tryToWrite() const;
 
 private:
     std::filesystem::path path;

@@ -53,7 +53,7 @@ TEST(Continuity, PassesOverWhatIsBeforeItsBeginning) {
 }
 
 TEST(Continuity, GoesOnAfterTheLastNumberOfAnEarlierRun) {
-    Continuity continuity = Continuity::after(41);
+    Continuity continuity = Continuity::after({41});
     EXPECT_EQ(continuity.next(), 42);
     EXPECT_THAT(shownOf(continuity, {41, 42}), ElementsAre(42));
 }
@@ -72,11 +72,18 @@ TEST(Continuity, MissesNothingBeforeTheFirstEventWhereAnyMayBeTheFirst) {
     EXPECT_EQ(continuity.next(), 502);
 }
 
-TEST(Continuity, TakesTheOrderInWhichABatchIsSent) {
+TEST(Continuity, ShowsABatchByItsNumbersSoThatTheLastOneIsTheGreatest) {
     Continuity continuity{1};
     const Continuity::Accepted accepted = continuity.accept(batch({2, 3, 1}));
-    EXPECT_THAT(accepted.fresh, ElementsAre(0U, 1U, 2U));
+    EXPECT_THAT(accepted.fresh, ElementsAre(2U, 0U, 1U));
     EXPECT_THAT(accepted.missing, IsEmpty());
+}
+
+TEST(Continuity, ShowsAnotherEventWithTheSameNumber) {
+    Continuity continuity{1};
+    EXPECT_THAT(shownEvents(continuity, {event(1, "a"), event(1, "a"), event(1, "b")}),
+                ElementsAre(1, 1));
+    EXPECT_THAT(shownEvents(continuity, {event(1, "b"), event(1, "c")}), ElementsAre(1));
 }
 
 TEST(Continuity, ShowsAnEventThatComesLate) {
@@ -87,25 +94,59 @@ TEST(Continuity, ShowsAnEventThatComesLate) {
     EXPECT_THAT(shownOf(continuity, {2, 3, 4}), IsEmpty());
 }
 
-TEST(Continuity, NoticesThatTheServiceCountsAnew) {
+TEST(Continuity, ComparesABatchWithWhatItShowed) {
+    using History = Continuity::History;
     Continuity continuity{1};
-    EXPECT_FALSE(continuity.beganAnew(7));
-    EXPECT_THAT(shownOf(continuity, {6, 7}), ElementsAre(6, 7));
-    EXPECT_FALSE(continuity.beganAnew(7));
-    EXPECT_FALSE(continuity.beganAnew(8));
-    EXPECT_TRUE(continuity.beganAnew(3));
-    EXPECT_EQ(continuity.next(), 0);
-    EXPECT_THAT(shownOf(continuity, {1, 2, 3}), ElementsAre(1, 2, 3));
-    EXPECT_FALSE(continuity.beganAnew(3));
+    EXPECT_EQ(continuity.compared({event(1, "a")}), History::unknown);
+    EXPECT_THAT(shownEvents(continuity, {event(1, "a"), event(2, "b")}), ElementsAre(1, 2));
+    EXPECT_EQ(continuity.compared({event(2, "b"), event(3, "c")}), History::same);
+    EXPECT_EQ(continuity.compared({event(3, "c")}), History::unknown);
+    EXPECT_EQ(continuity.compared({event(1, "a"), event(2, "other")}), History::different);
+}
+
+TEST(Continuity, ComparesWithWhatAnEarlierRunShowed) {
+    const Continuity continuity = Continuity::after({7, contentOf(event(7, "a"))});
+    EXPECT_EQ(continuity.compared({event(7, "a")}), Continuity::History::same);
+    EXPECT_EQ(continuity.compared({event(7, "b")}), Continuity::History::different);
 }
 
 TEST(Continuity, KnowsByTheirContentWhatItShowedBeforeTheServiceCountedAnew) {
     Continuity continuity{1};
     EXPECT_THAT(shownEvents(continuity, {event(1, "old"), event(2, "old"), event(3, "lost")}),
                 ElementsAre(1, 2, 3));
-    EXPECT_TRUE(continuity.beganAnew(2));
+    continuity.beginAnew();
+    EXPECT_EQ(continuity.next(), 0);
+    EXPECT_EQ(continuity.last(), std::nullopt);
     EXPECT_THAT(shownEvents(continuity, {event(1, "old"), event(2, "old"), event(3, "new")}),
                 ElementsAre(3));
+    EXPECT_EQ(continuity.next(), 4);
+}
+
+TEST(Continuity, ExpectsNumbersAgainThatTheServiceHasLost) {
+    Continuity continuity{1};
+    EXPECT_THAT(shownEvents(continuity, {event(1), event(2), event(3, "lost")}),
+                ElementsAre(1, 2, 3));
+    continuity.shrinkTo(2);
+    EXPECT_EQ(continuity.next(), 3);
+    EXPECT_THAT(shownEvents(continuity, {event(3, "new")}), ElementsAre(3));
+}
+
+TEST(Continuity, AsksForTheLastOneShownAgainAndForWhatIsMissingALittleBelow) {
+    Continuity continuity{1};
+    EXPECT_EQ(continuity.overlapping(), 1);
+    static_cast<void>(continuity.accept(batch({1, 2})));
+    EXPECT_EQ(continuity.overlapping(), 2);
+    EXPECT_FALSE(continuity.waitsForLateEvents());
+    static_cast<void>(continuity.accept(batch({5})));
+    EXPECT_EQ(continuity.overlapping(), 3);
+    EXPECT_TRUE(continuity.waitsForLateEvents());
+    static_cast<void>(continuity.accept(batch({103})));
+    EXPECT_EQ(continuity.overlapping(), 6);
+    static_cast<void>(continuity.accept(batch({104})));
+    // From further below, the library would read nothing that is ahead.
+    EXPECT_EQ(continuity.overlapping(), 6);
+    static_cast<void>(continuity.accept(batch({500})));
+    EXPECT_EQ(continuity.overlapping(), 500);
 }
 
 TEST(Continuity, AsksNotAgainWhereThereIsNothing) {

@@ -34,5 +34,13 @@ TEST(Hook, IsToldToEndWhenTheProgramIs) {
     EXPECT_EQ(runHook("exec sleep 600", "", stopped.get_token()), "was ended by signal 15");
 }
 
+TEST(Hook, IsToldToEndWithAllThatItHasStarted) {
+    std::stop_source stopped;
+    stopped.request_stop();
+    // The shell waits for the other one, whose end it tells.
+    EXPECT_EQ(runHook("sh -c 'exec sleep 600'; exit 7", "", stopped.get_token()),
+              "was ended by signal 15");
+}
+
 }  // namespace
 }  // namespace raidinfo

@@ -27,24 +27,32 @@ void expectBadInput(const std::string& content) {
 
 TEST(StateFile, IsEmptyBeforeItIsWritten) { EXPECT_EQ(StateFile{"state"}.read(), std::nullopt); }
 
-TEST(StateFile, KeepsTheNumber) {
+TEST(StateFile, KeepsTheNumberAndTheContent) {
     const StateFile state{"state"};
-    state.write(41);
-    state.write(2147483647);
-    EXPECT_EQ(StateFile{"state"}.read(), 2147483647);
+    state.write({41});
+    EXPECT_EQ(StateFile{"state"}.read(), LastShown{41});
+    state.write({2147483647, 0xFEDCBA9876543210U});
+    EXPECT_EQ(StateFile{"state"}.read(), (LastShown{2147483647, 0xFEDCBA9876543210U}));
     EXPECT_FALSE(std::filesystem::exists("state.new"));
     std::filesystem::remove("state");
 }
 
 TEST(StateFile, IsNotTakenForANumberWhenItHoldsSomethingElse) {
-    for (const char* const content : {"", "12", "12 \n", "x\n", "-1\n", "99999999999999999999\n"}) {
+    for (const char* const content : {"", "12", "12 \n", "x\n", "-1\n", "1 g\n", "1 2 3\n", "1 11112222333344445\n",
+                                "99999999999999999999\n"}) {
         expectBadInput(content);
     }
 }
 
+TEST(StateFile, IsTriedWithoutATrace) {
+    StateFile{"state"}.tryToWrite();
+    EXPECT_FALSE(std::filesystem::exists("state"));
+    EXPECT_THROW(StateFile{"nowhere/state"}.tryToWrite(), Failure);
+}
+
 TEST(StateFile, SaysThatItCannotBeWritten) {
     try {
-        StateFile{"nowhere/state"}.write(1);
+        StateFile{"nowhere/state"}.write({1});
         FAIL();
     } catch (const Failure& failure) {
         EXPECT_EQ(failure.status(), ExitStatus::cannotCreate);
