@@ -8,6 +8,7 @@
 #include <cerrno>
 #include <cstddef>
 #include <cstdio>
+#include <optional>
 #include <system_error>
 #include <utility>
 
@@ -17,14 +18,36 @@ namespace raidinfo {
 namespace {
 
 constexpr mode_t readableByAll = 0644;
+constexpr mode_t permissionBits = 07777;
+constexpr int longestChain = 40;  ///< of links, as for the system
 
 Failure failure(ExitStatus status, const std::string& what, const std::filesystem::path& path) {
     return {status, what + " " + path.string() + ": " + std::generic_category().message(errno)};
 }
 
-int opened(const std::filesystem::path& path, int flags) {
+int opened(const std::filesystem::path& path, int flags, mode_t mode = readableByAll) {
     // NOLINTNEXTLINE(cppcoreguidelines-pro-type-vararg): open has no other form
-    return open(path.c_str(), flags | O_CLOEXEC, readableByAll);
+    return open(path.c_str(), flags | O_CLOEXEC, mode);
+}
+
+/// What stands there, behind all links.
+std::optional<struct stat> statusOf(const std::filesystem::path& path) {
+    struct stat status = {};
+    return stat(path.c_str(), &status) == 0 ? std::optional{status} : std::nullopt;
+}
+
+/// Where the links lead to, be something there or not.
+std::filesystem::path withoutLinks(std::filesystem::path path) {
+    std::error_code noLink;
+    for (int link = 0; link <= longestChain; ++link) {
+        const std::filesystem::path target = std::filesystem::read_symlink(path, noLink);
+        if (noLink) {
+            return path;
+        }
+        path = path.parent_path() / target;
+    }
+    errno = ELOOP;
+    throw failure(ExitStatus::cannotCreate, "cannot write", path);
 }
 
 int created(const std::filesystem::path& path) {
@@ -45,6 +68,54 @@ bool writeAll(const Descriptor& file, std::string_view content) {
     }
     return true;
 }
+
+/// A file beside the one that it is going to replace, of a name that no other has; gone in the end
+/// if it was not moved there.
+class NewFile {
+public:
+    NewFile(const std::filesystem::path& place, const std::optional<struct stat>& before)
+        : file{make(place, before ? before->st_mode & permissionBits : readableByAll),
+               "cannot write a file"} {
+        if (before) {
+            // Who may not give the file away keeps it. Changing the owner takes special bits away,
+            // and the umask has taken others.
+            [[maybe_unused]] const int owner = fchown(file.get(), before->st_uid, before->st_gid);
+            fchmod(file.get(), before->st_mode & permissionBits);
+        }
+    }
+    NewFile(const NewFile&) = delete;
+    NewFile& operator=(const NewFile&) = delete;
+    ~NewFile() {
+        const int reason = errno;
+        unlink(name.c_str());
+        errno = reason;
+    }
+
+    [[nodiscard]] const Descriptor& descriptor() const noexcept { return file; }
+
+    [[nodiscard]] bool moveTo(const std::filesystem::path& place) const {
+        return fsync(file.get()) == 0 && std::rename(name.c_str(), place.c_str()) == 0;
+    }
+
+private:
+    /// The process number keeps two runs apart, and what an ended run has left is passed by.
+    int make(const std::filesystem::path& place, mode_t mode) {
+        for (int attempt = 0;; ++attempt) {
+            name = place;
+            name += "." + std::to_string(getpid()) + "-" + std::to_string(attempt) + ".new";
+            const int number = opened(name, O_WRONLY | O_CREAT | O_EXCL, mode);
+            if (number >= 0) {
+                return number;
+            }
+            if (errno != EEXIST) {
+                throw failure(ExitStatus::cannotCreate, "cannot write", place);
+            }
+        }
+    }
+
+    std::filesystem::path name;
+    Descriptor file;
+};
 
 }  // namespace
 
@@ -70,14 +141,14 @@ std::string readFile(const std::filesystem::path& path) {
 }
 
 void replaceFile(const std::filesystem::path& path, std::string_view content) {
-    std::filesystem::path temporary = path;
-    temporary += ".new";
-    const Descriptor file{created(temporary), "cannot write a file"};
-    if (!writeAll(file, content) || fsync(file.get()) != 0 ||
-        std::rename(temporary.c_str(), path.c_str()) != 0) {
-        const int reason = errno;
-        unlink(temporary.c_str());
-        errno = reason;
+    const auto before = statusOf(path);
+    if (before && !S_ISREG(before->st_mode)) {
+        GrowingFile{path}.append(content);
+        return;
+    }
+    const std::filesystem::path place = withoutLinks(path);
+    const NewFile beside{place, before};
+    if (!writeAll(beside.descriptor(), content) || !beside.moveTo(place)) {
         throw failure(ExitStatus::cannotCreate, "cannot write", path);
     }
 }

@@ -12,7 +12,8 @@ namespace raidinfo {
 [[nodiscard]] std::string readFile(const std::filesystem::path& path);
 
 /// Writes the file beside its place and then moves it there, so that nobody ever sees half of it.
-/// What cannot be written is a cannotCreate Failure.
+/// Links stay links, and the file's mode stays what it was. What is no regular file, such as a
+/// pipe, is written to. What cannot be written is a cannotCreate Failure.
 void replaceFile(const std::filesystem::path& path, std::string_view content);
 
 /// A new file that is good after every piece that is appended. What cannot be written is a
