@@ -21,7 +21,11 @@ namespace {
 
 using nlohmann::json;
 using raid::test::answering;
+using raid::test::Connection;
+using raid::test::End;
+using raid::test::newestEventDocument;
 using raid::test::ScriptedService;
+using raid::test::Stage;
 using testing::HasSubstr;
 
 json dataOf(const Result& result) {
@@ -40,14 +44,32 @@ protected:
     }
 
     // Until the recorder has written it.
-    void waitForFile(const std::string& first, const std::string& behindIt = "") const {
-        for (bool found = false; !found; static_cast<void>(poll(nullptr, 0, milliseconds))) {
-            std::ostringstream content;
-            content << std::ifstream{file}.rdbuf();
-            const std::size_t place = content.str().find(first);
-            found = place != std::string::npos &&
-                    content.str().find(behindIt, place) != std::string::npos;
+    void waitForFile(const std::string& text) const {
+        while (saved().find(text) == std::string::npos) {
+            static_cast<void>(poll(nullptr, 0, milliseconds));
         }
+    }
+
+    std::string saved() const {
+        std::ostringstream content;
+        content << std::ifstream{file}.rdbuf();
+        return content.str();
+    }
+
+    // How often it is written.
+    std::size_t occurrences(const std::string& text) const {
+        const std::string content = saved();
+        std::size_t count = 0;
+        for (std::size_t place = content.find(text); place != std::string::npos;
+             place = content.find(text, place + 1)) {
+            ++count;
+        }
+        return count;
+    }
+
+    int interrupted(Program& recorder) const {
+        recorder.signal(SIGINT);
+        return recorder.finish().status;
     }
 
     const std::string file = "saved.rec";
@@ -88,14 +110,93 @@ TEST_F(Recording, HasTheEventsAndTheConfigurationsThatCameWhileItWasMade) {
     waitForFile("first");
     simulator.command("set adapter:1/channel:1/drive:3 overallStatus=2");
     simulator.command("event string=second");
-    // The configuration is asked for behind the events.
-    waitForFile("second", "</m:getConfigResponse>");
+    waitForFile("second");
     recorder.signal(SIGINT);
     EXPECT_EQ(recorder.finish().status, 130);
     const Result shown = run(from({"events"}));
     EXPECT_THAT(shown.output, testing::AllOf(HasSubstr("first"), HasSubstr("second")));
     EXPECT_EQ(std::ranges::count(shown.output, '\n'), 2);
     EXPECT_THAT(run(from({"tree"})).output, HasSubstr("Disk drive 3: Critical"));
+}
+
+TEST_F(Recording, HasAnEventWhoseNumberIsFarFromThoseBefore) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event string=first");
+    Program recorder{raidinfo({"record", file})};
+    waitForFile("first");
+    simulator.command("event sequenceNumber=500000 string=second");
+    waitForFile("second");
+    simulator.command("event string=third");
+    waitForFile("third");
+    EXPECT_EQ(interrupted(recorder), 130);
+    EXPECT_EQ(occurrences(" configuration "), 1U);
+    EXPECT_LE(occurrences(" events "), 3U);
+}
+
+TEST_F(Recording, HasAnAnswerOnceThatComesAgainAndAgain) {
+    const std::string malformed = eventBatch({2}).substr(0, 400);
+    const auto batch = [](const std::vector<int>& numbers) {
+        return answering(eventBatch(numbers));
+    };
+    const ScriptedService service{
+        {answering(newestEventDocument("1")), batch({1}), answering(configuration("")),
+         answering(newestEventDocument("2")), answering(malformed), answering(configuration("")),
+         answering(newestEventDocument("2")), answering(malformed), answering(configuration("")),
+         Connection{.end = End::hold}}};
+    Program recorder{raidinfo({"record", file})};
+    service.waitFor(9, Stage::requestRead);
+    EXPECT_EQ(interrupted(recorder), 130);
+    EXPECT_EQ(occurrences(" configuration "), 1U);
+    EXPECT_EQ(occurrences(" events "), 2U);
+    EXPECT_EQ(occurrences("failure "), 0U);
+}
+
+TEST_F(Recording, HasTheEventsOfAServiceThatCountsAnewAfterARestart) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event string=first\nevent string=second");
+    Program recorder{raidinfo({"record", file})};
+    waitForFile("second");
+    simulator.command("down");
+    waitForFile("failure ");
+    simulator.command("forget\nup\nevent string=third");
+    waitForFile("third");
+    simulator.command("event string=fourth");
+    waitForFile("fourth");
+    EXPECT_EQ(interrupted(recorder), 130);
+    EXPECT_EQ(occurrences("failure "), 1U);
+    EXPECT_EQ(occurrences(" configuration "), 1U);
+}
+
+TEST_F(Recording, DoesNotTakeItsOwnEndForTheServices) {
+    const Simulator simulator{"small-server.xml"};
+    EXPECT_EQ(run({"record", "--for", "1", file}).status, 0);
+    EXPECT_EQ(occurrences("failure "), 0U);
+}
+
+TEST_F(Recording, KeepsItsConfigurationWhenItIsInterruptedWhileItAsksForTheNext) {
+    {
+        const ScriptedService service{
+            {answering(newestEventDocument("1")), answering(eventBatch({1})),
+             answering(configuration(sampleAdapter())), answering(newestEventDocument("2")),
+             answering(eventBatch({2})), Connection{.end = End::hold}}};
+        Program recorder{raidinfo({"record", file})};
+        service.waitFor(5, Stage::requestRead);
+        EXPECT_EQ(interrupted(recorder), 130);
+    }
+    EXPECT_EQ(occurrences("failure "), 0U);
+    EXPECT_THAT(run(from({"tree"})).output, HasSubstr("Pellion 4220"));
+}
+
+TEST_F(Recording, IsShownByItsLastConfigurationThatCanBeRead) {
+    const std::string good = configuration(sampleAdapter());
+    const auto answer = [](const std::string& body) {
+        return "answer 0 configuration " + std::to_string(body.size()) + "\n" + body + "\n";
+    };
+    raid::test::writeFile(file, "raid-recording 1 2026-11-21T17:48:00Z\n" + answer(good) +
+                                    answer(good.substr(0, 500)) + "failure 0 configuration\n");
+    const Result shown = run(from({"tree"}));
+    EXPECT_EQ(shown.status, 0);
+    EXPECT_THAT(shown.output, HasSubstr("Pellion 4220"));
 }
 
 // Everything between the tags of this element, wherever it stands.
@@ -134,6 +235,32 @@ TEST_F(Recording, ThatIsRedactedHasNothingOfTheServerInItsEvents) {
     EXPECT_TRUE(std::regex_search(shown, sameNameTwice)) << shown;
 }
 
+TEST_F(Recording, ThatIsRedactedHasNothingOfADriveThatIsInsertedMeanwhile) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event string=first");
+    Program recorder{raidinfo({"record", "--redact", file})};
+    waitForFile("first");
+    simulator.command(
+        "add adapter:1/channel:1/drive:9 like adapter:1/channel:1/drive:3 serialNumber=SECRET0099\n"
+        "event string=\"drive SECRET0099 inserted\"");
+    waitForFile("inserted");
+    EXPECT_EQ(interrupted(recorder), 130);
+    EXPECT_EQ(occurrences("SECRET0099"), 0U);
+    EXPECT_EQ(occurrences(" configuration "), 2U);
+}
+
+TEST_F(Recording, ThatIsRedactedHasNoEventsWithoutAConfigurationThatKnowsTheirNames) {
+    const ScriptedService service{{answering(newestEventDocument("1")), answering(eventBatch({1})),
+                                   answering(configuration("")),
+                                   answering(newestEventDocument("2")), answering(eventBatch({2})),
+                                   Connection{}, Connection{.end = End::hold}}};
+    Program recorder{raidinfo({"record", "--redact", file})};
+    service.waitFor(6, Stage::requestRead);
+    EXPECT_EQ(interrupted(recorder), 130);
+    EXPECT_EQ(occurrences("event 1"), 1U);
+    EXPECT_EQ(occurrences("event 2"), 0U);
+}
+
 // The tree with one text for every serial number.
 json withoutSerials(json tree) {
     for (auto& [key, value] : tree.items()) {
@@ -161,9 +288,9 @@ TEST_F(Recording, ThatIsRedactedShowsTheSameTreeButForTheSerialNumbers) {
 
 TEST_F(Recording, OfAMalformedAnswerIsMalformed) {
     {
-        const ScriptedService service{{answering("<?xml version='1.0'?><env:Envelope>"),
-                                       answering(raid::test::newestEventDocument("0")),
-                                       answering(eventBatch({}))}};
+        const ScriptedService service{{answering(newestEventDocument("0")),
+                                       answering(eventBatch({})),
+                                       answering("<?xml version='1.0'?><env:Envelope>")}};
         EXPECT_EQ(run({"record", "--for", "0", file}).status, 0);
     }
     const Result result = run(from({"list"}));
@@ -182,6 +309,12 @@ TEST_F(Recording, IsNotMadeWithoutAService) {
     const Result result = run({"record", "--for", "0", file});
     EXPECT_EQ(result.status, 69);
     EXPECT_THAT(result.errors, HasSubstr("does not answer"));
+}
+
+TEST_F(Recording, ThatIsThereIsKeptWhenTheServiceDoesNotAnswer) {
+    raid::test::writeFile(file, "an earlier recording");
+    EXPECT_EQ(run({"record", "--for", "0", file}).status, 69);
+    EXPECT_EQ(raid::test::readFile(file), "an earlier recording");
 }
 
 TEST_F(Recording, IsNothingToWatchRecordOrExamine) {

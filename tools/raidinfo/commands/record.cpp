@@ -1,5 +1,6 @@
 #include <nlohmann/json.hpp>
 #include <optional>
+#include <string>
 
 #include "commands/commands.h"
 #include "exit_status.h"
@@ -14,20 +15,30 @@ int runCommand(const Session& session, const RecordOptions& record) {
     if (session.recorded()) {
         throw Failure{ExitStatus::usage, "record saves what the service answers, not a recording"};
     }
-    GrowingFile file{record.file};
-    file.append(recording::heading(presentTimestamp()));
+    const std::string heading = recording::heading(presentTimestamp());
+    std::optional<GrowingFile> file;  // from the first answer on: a recording that is there is kept
     std::optional<redact::Redactor> redactor;
     if (record.redact) {
         redactor.emplace();
     }
     std::size_t answers = 0;
+    bool knowsNames = false;
     const auto sink = [&](const recording::Entry& entry) {
+        if (entry.question == recording::Question::configuration) {
+            knowsNames = entry.body.has_value();
+        } else if (redactor && entry.body && !knowsNames) {
+            return;  // The messages may mention what only the lost configuration tells.
+        }
         ++answers;
         recording::Entry kept = entry;
         if (redactor && kept.body) {
             kept.body = (*redactor)(*kept.body);
         }
-        file.append(recording::written(kept));
+        if (!file) {
+            file.emplace(record.file);
+            file->append(heading);
+        }
+        file->append(recording::written(kept));
     };
     recordAnswers(session.library(), sink, record.duration, session.stop());
     if (session.options().json) {

@@ -5,6 +5,7 @@
 #include <unistd.h>
 
 #include <optional>
+#include <ranges>
 #include <string>
 
 #include "exit_status.h"
@@ -65,22 +66,29 @@ recording::Recording readRecording(const std::filesystem::path& path) {
 }
 
 Inventory recordedInventory(const Library& library, const recording::Recording& recorded) {
-    const std::optional<std::string>* last = nullptr;
-    for (const recording::Entry& entry : recorded.entries) {
-        if (entry.question == Question::configuration) {
-            last = &entry.body;
+    const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
+    const auto answers = [](const recording::Entry& entry) {
+        return entry.question == Question::configuration && entry.body;
+    };
+    bool isAnswered = false;
+    bool isRead = false;
+    for (const recording::Entry& entry :
+         recorded.entries | std::views::reverse | std::views::filter(answers)) {
+        isAnswered = true;
+        readSaved(library, readConfiguration, *entry.body);
+        isRead = *system != nullptr;
+        if (isRead) {
+            break;
         }
     }
-    if (last == nullptr || !*last) {
+    if (!isAnswered) {
         throw Failure{ExitStatus::serviceUnavailable, "the recording holds no configuration"};
     }
-    readSaved(library, readConfiguration, **last);
-    const RAIDSystem* const system = *library.variable<const RAIDSystem*>("raidSystem");
-    if (system == nullptr) {
+    if (!isRead) {
         throw malformedAnswer();
     }
     callWithoutExchange(library, "RAIDinit");
-    return {RecordReader{library}.readInventory(), system->getAdapters()};
+    return {RecordReader{library}.readInventory(), (*system)->getAdapters()};
 }
 
 std::optional<Records> eventsIn(const Library& library, RecordReader& reader,

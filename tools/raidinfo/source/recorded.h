@@ -13,9 +13,9 @@ namespace raidinfo {
 /// Reads the file; Failures where it cannot be read or is no recording.
 [[nodiscard]] recording::Recording readRecording(const std::filesystem::path& path);
 
-/// The inventory by the recording's last configuration. Fails as if the service had answered now:
-/// with serviceUnavailable where there is no answer, with malformedAnswer where the library cannot
-/// read it.
+/// The inventory by the recording's last configuration that the library can read. Fails as if the
+/// service had answered now: with serviceUnavailable where there is no answer, with malformedAnswer
+/// where the library can read none.
 [[nodiscard]] Inventory recordedInventory(const Library& library,
                                           const recording::Recording& recorded);
 

@@ -4,8 +4,10 @@
 #include <cstdint>
 #include <cstdlib>
 #include <limits>
+#include <map>
 #include <memory>
 #include <string>
+#include <utility>
 
 #include "agent/requests.h"
 #include "source/recorded.h"
@@ -24,46 +26,83 @@ constexpr std::int64_t numbersAsked = 101;
 
 class Recorder {
 public:
-    Recorder(const Library& loaded, const EntrySink& destination)
+    Recorder(const Library& loaded, const EntrySink& destination, std::stop_token whenOver)
         : library{loaded},
           exchange{loaded.function<char*(const char*)>("_Z11getSOAPDataPKc")},
+          askNewest{loaded.function<int()>("enableRAIDEvent")},
+          newest{loaded.variable<int>("nextSequenceNumber")},
           reader{loaded},
-          sink{destination} {}
+          sink{destination},
+          over{std::move(whenOver)} {}
 
-    /// The configuration and all events that there are. Returns whether the service answers.
+    /// All events that there are, and the configuration. Returns whether the service answers.
     bool recordAll() {
+        const auto newestEvent = ask(raid::agent::newestEventRequest());
+        const auto events = ask(raid::agent::eventListRequest);
         const auto configuration = ask(raid::agent::configurationRequest);
         if (!configuration) {
             return false;
         }
         add(Question::configuration, configuration);
-        add(Question::newestEvent, ask(raid::agent::newestEventRequest()));
-        const auto events = ask(raid::agent::eventListRequest);
+        add(Question::newestEvent, newestEvent);
         add(Question::events, events);
-        learnNumbers(events);
+        last = greatestIn(events).value_or(0);
         return true;
     }
 
-    /// Waits for an event after those that were recorded, then records the new ones and the
-    /// configuration. Returns whether the service answers.
-    bool recordNext(const std::stop_token& stop) {
-        if (!ask(raid::agent::waitNextEventRequest(bounded(last)))) {
-            if (!stop.stop_requested()) {
-                add(Question::events, std::nullopt);
-            }
+    /// Waits for events after those that were recorded, and records them. Returns whether there
+    /// were any; if not, it is no use to ask again at once.
+    bool recordNext() {
+        if (askNewest() == 0) {
+            add(Question::events, std::nullopt);
+            isDoubtful = true;
             return false;
         }
-        const auto events =
-            ask(raid::agent::eventsRequest(bounded(last + 1), bounded(last + numbersAsked)));
-        add(Question::events, events);
-        learnNumbers(events);
-        add(Question::configuration, ask(raid::agent::configurationRequest));
-        return true;
+        // A service that was restarted may count anew, and would let a wait for the old numbers
+        // hang.
+        const std::int64_t newestNumber = *newest;
+        if (isDoubtful || newestNumber < last) {
+            isDoubtful = !recordAll();
+            return false;
+        }
+        if (newestNumber <= last && !ask(raid::agent::waitNextEventRequest(bounded(last)))) {
+            isDoubtful = true;
+            return false;
+        }
+        return recordEventsUpTo(newestNumber);
     }
 
 private:
     static int bounded(std::int64_t number) {
         return static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max()));
+    }
+
+    /// The configuration is asked for after the events and written before them, so that it knows
+    /// the names of all that they tell about.
+    bool recordEventsUpTo(std::int64_t newestNumber) {
+        auto events =
+            ask(raid::agent::eventsRequest(bounded(last + 1), bounded(last + numbersAsked)));
+        auto greatest = greatestIn(events);
+        if (greatest == 0 && newestNumber > last + numbersAsked) {
+            events = ask(raid::agent::eventListRequest);  // The numbers asked for are passed over.
+            greatest = greatestIn(events);
+        }
+        if (!events) {
+            isDoubtful = true;
+            return false;
+        }
+        if (greatest && *greatest <= last) {
+            return false;
+        }
+        const auto configuration = ask(raid::agent::configurationRequest);
+        if (over.stop_requested()) {
+            return false;
+        }
+        isDoubtful = !configuration;
+        add(Question::configuration, configuration);
+        add(Question::events, events);
+        last = greatest.value_or(last);
+        return greatest.has_value();
     }
 
     [[nodiscard]] std::optional<std::string> ask(const std::string& request) const {
@@ -77,49 +116,72 @@ private:
         return body ? std::optional<std::string>{body.get()} : std::nullopt;
     }
 
-    void add(Question question, std::optional<std::string> body) const {
+    /// What says nothing new is not written, lest a service that fails again and again fill the
+    /// disk. An exchange that was ended from here tells nothing of the service.
+    void add(Question question, const std::optional<std::string>& body) {
+        const auto before = recorded.find(question);
+        const bool isKnown = before != recorded.end() && before->second == body;
+        if (isKnown || (!body && over.stop_requested())) {
+            return;
+        }
+        recorded.insert_or_assign(question, body);
         sink({std::chrono::duration_cast<std::chrono::milliseconds>(Clock::now() - start), question,
-              std::move(body)});
+              body});
     }
 
-    void learnNumbers(const std::optional<std::string>& events) {
+    /// The greatest number of a batch, 0 in an empty one; nothing where it cannot be read.
+    [[nodiscard]] std::optional<std::int64_t> greatestIn(const std::optional<std::string>& events) {
         const auto batch = events ? eventsIn(library, reader, *events) : std::nullopt;
-        if (batch) {
-            for (const Record& event : *batch) {
-                const std::int64_t number = numberOf(eventKind(), event, "sequence_number");
-                last = std::max(last, number);
-            }
+        if (!batch) {
+            return std::nullopt;
         }
+        std::int64_t greatest = 0;
+        for (const Record& event : *batch) {
+            const std::int64_t number = numberOf(eventKind(), event, "sequence_number");
+            greatest = std::max(greatest, number);
+        }
+        return greatest;
     }
 
     const Library& library;
     char* (*exchange)(const char*);
+    int (*askNewest)();
+    const int* newest;  ///< the library's next number, which askNewest sets to the newest
     RecordReader reader;
     const EntrySink& sink;
+    std::stop_token over;
     Clock::time_point start = Clock::now();
-    std::int64_t last = 0;
+    std::map<Question, std::optional<std::string>> recorded;  ///< last of each question
+    std::int64_t last = 0;                                    ///< number recorded
+    bool isDoubtful = false;  ///< whether the service is the one that was asked before
 };
 
 }  // namespace
 
 void recordAnswers(const Library& library, const EntrySink& sink,
                    std::optional<std::chrono::seconds> duration, const std::stop_token& stop) {
-    Recorder recorder{library, sink};
+    std::stop_source over;
+    const std::stop_callback stopped{stop, [&over] { over.request_stop(); }};
+    Recorder recorder{library, sink, over.get_token()};
     if (!recorder.recordAll()) {
         throw serviceUnavailable();
     }
-    const auto end = Clock::now() + duration.value_or(std::chrono::seconds{0});
-    const auto isOver = [&] { return stop.stop_requested() || (duration && Clock::now() >= end); };
+    if (duration == std::chrono::seconds{0}) {
+        return;
+    }
     std::optional<Alarm> alarm;
     if (duration) {
-        alarm.emplace(*duration, library.function<void()>("cancelGetEvent"));
+        alarm.emplace(*duration, [&over, cancel = library.function<void()>("cancelGetEvent")] {
+            over.request_stop();
+            cancel();
+        });
     }
     Backoff backoff;
-    while (!isOver()) {
-        if (recorder.recordNext(stop)) {
+    while (!over.stop_requested()) {
+        if (recorder.recordNext()) {
             backoff.reset();
-        } else if (!isOver()) {
-            backoff.wait(stop);
+        } else {
+            backoff.wait(over.get_token());
         }
     }
 }

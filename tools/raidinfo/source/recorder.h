@@ -14,9 +14,10 @@ namespace raidinfo {
 using EntrySink = std::function<void(const recording::Entry&)>;
 
 /// Asks for the configuration and the events and then, at each new event, again, and hands over
-/// every answer as it came, until stop is requested or the duration is over; a duration of 0 asks
-/// once. A service that cannot be reached at first is a Failure; one that goes away is waited for,
-/// and recorded as gone.
+/// every answer that says something new, as it came, until stop is requested or the duration is
+/// over; a duration of 0 asks once. A configuration comes before the events that may be about it. A
+/// service that cannot be reached at first is a Failure; one that goes away is waited for, recorded
+/// as gone, and asked for everything when it is back.
 void recordAnswers(const Library& library, const EntrySink& sink,
                    std::optional<std::chrono::seconds> duration, const std::stop_token& stop);
 
