@@ -156,6 +156,12 @@ const std::vector<RuleCase> cases{
     {"state-unknown", Severity::unknown, "adapter 1, channel 1, disk drive 1, serial QS1",
      "state 5 (unknown)", setting(KindId::diskDrive, 1, "state", 5),
      setting(KindId::diskDrive, 1, "state", 4)},
+    {"raid-level-unknown", Severity::unknown, "adapter 1, array 0, logical drive 0",
+     "RAID level 77 (unknown)", setting(KindId::logicalDrive, 0, "raid_level", 77),
+     setting(KindId::logicalDrive, 0, "raid_level", 0)},
+    {"write-cache-mode-unknown", Severity::unknown, "adapter 1, array 0, logical drive 0",
+     "write cache mode 99 (unknown)", setting(KindId::logicalDrive, 0, "write_cache_mode", 99),
+     setting(KindId::logicalDrive, 0, "write_cache_mode", 0)},
     {"part-status-unknown", Severity::unknown,
      "adapter 1, channel 1, enclosure 8, temperature sensor 0", "status -1 (unknown)",
      setting(KindId::temperatureSensor, 0, "status", -1),
@@ -220,17 +226,32 @@ TEST(DefaultRules, FindNothingWrongWithAHealthyMachine) {
     EXPECT_THAT(verdict.findings, IsEmpty());
 }
 
-// Whatever has a status must not pass for well when the status is not understood.
-TEST(DefaultRules, CallNothingOkWhoseStatusIsUnknown) {
-    const std::vector<std::pair<KindId, std::string_view>> statuses{
+// Which level has no redundancy is for the code book to say.
+TEST(DefaultRules, AskForAHotSpareByTheNameOfTheRaidLevel) {
+    CodeBook book = shippedCodeBook();
+    book.define("logical_drives", "raid_level", CodeBook::Codes{{5, "RAID 0"}, {0, "RAID 5"}});
+    for (const auto& [level, missing] : {std::pair{5, 0U}, std::pair{0, 1U}}) {
+        Machine machine;
+        noHotSpare(machine);
+        machine.set(KindId::logicalDrive, 0, "raid_level", level);
+        const Verdict verdict = judge(machine.trees(), defaultPolicy(book), book);
+        EXPECT_EQ(findingsOf(verdict, "hot-spare-missing").size(), missing) << level;
+    }
+}
+
+// Whatever a rule looks at must not pass for well when it is not understood.
+TEST(DefaultRules, CallNothingOkWhoseCodesAreUnknown) {
+    const std::vector<std::pair<KindId, std::string_view>> codes{
         {KindId::pellionAdapter, "battery_status"},
         {KindId::logicalDrive, "state"},
+        {KindId::logicalDrive, "raid_level"},
+        {KindId::logicalDrive, "write_cache_mode"},
         {KindId::diskDrive, "state"},
         {KindId::enclosure, "state"},
         {KindId::fan, "status"},
         {KindId::powerSupply, "status"},
         {KindId::temperatureSensor, "status"}};
-    for (const auto& [kind, field] : statuses) {
+    for (const auto& [kind, field] : codes) {
         for (const int code : {-1, 99, std::numeric_limits<int>::max()}) {
             Machine machine;
             machine.set(kind, 0, field, code);
