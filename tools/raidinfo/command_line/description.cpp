@@ -49,9 +49,15 @@ std::optional<std::chrono::milliseconds> limitOf(const Words& words) {
 
 CLI::Validator between(int least, int most) { return CLI::Range(least, most).description(""); }
 
+/// Refuses what a shell makes of a variable that is not set: it would pass for no value at all.
+CLI::Validator notEmpty() {
+    return {[](const std::string& word) -> std::string { return word.empty() ? "is empty" : ""; },
+            ""};
+}
+
 ListOptions readList(const CLI::App& app, const Words& words) {
     ListOptions list{.headings = !words.noHeadings};
-    if (!words.kind.empty()) {
+    if (app.count("kind") > 0) {
         list.kind = kindNamed(words.kind);
     }
     if (app.count("--columns") > 0) {
@@ -133,11 +139,13 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          app.add_option("--exec", words.command,
                         "Run this shell command for each event, the event as JSON on its input")
              ->type_name("COMMAND")
+             ->check(notEmpty())
              ->take_last();
          app.add_option(
                 "--state", words.state,
                 "Keep the last number in this file, and go on from there when started again")
              ->type_name(value_type::file)
+             ->check(notEmpty())
              ->take_last();
      },
      [](const CLI::App& app, const Words& words) -> CommandOptions {
@@ -171,6 +179,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          app.add_flag("--nagios", words.nagios, "Print the one line of a monitoring plugin");
          app.add_option("--policy", words.policy, "Change the rules by this file")
              ->type_name(value_type::file)
+             ->check(notEmpty())
              ->take_last();
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {
@@ -182,6 +191,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      [](CLI::App& app, Words& words) {
          app.add_option("file", words.file, "The file to write")
              ->type_name(value_type::file)
+             ->check(notEmpty())
              ->required();
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {
@@ -198,8 +208,11 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      [](CLI::App& app, Words& words) {
          app.add_option("before", words.before, "The earlier snapshot")
              ->type_name(value_type::file)
+             ->check(notEmpty())
              ->required();
-         app.add_option("after", words.after, "The later one")->type_name(value_type::file);
+         app.add_option("after", words.after, "The later one")
+             ->type_name(value_type::file)
+             ->check(notEmpty());
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {
          return DiffOptions{words.before, words.after};
@@ -212,6 +225,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      [](CLI::App& app, Words& words) {
          app.add_option("file", words.file, "The file to write")
              ->type_name(value_type::file)
+             ->check(notEmpty())
              ->required();
          app.add_flag("--redact", words.redact,
                       "Replace serial numbers, addresses and names, each always by the same");
@@ -292,12 +306,15 @@ Description::Description()
         ->take_last();
     parser->add_option("--from", words.recording, "Read this recording instead of the service")
         ->type_name(value_type::file)
+        ->check(notEmpty())
         ->take_last();
     parser->add_option("--codes", words.codes, "Take the meanings of codes from this file")
         ->type_name(value_type::file)
+        ->check(notEmpty())
         ->take_last();
     parser->add_option("--library", words.library, "Load this library file")
         ->type_name(value_type::file)
+        ->check(notEmpty())
         ->take_last();
     parser
         ->add_option("--timeout", words.timeout,

@@ -142,6 +142,20 @@ TEST(Options, ThatAreWrongAreAUsageFailure) {
     }
 }
 
+// "$UNSET" in a script must not turn a question about a file into one about this machine.
+TEST(Options, RefuseAnEmptyValue) {
+    using Arguments = std::vector<const char*>;
+    for (const Arguments& wrong :
+         {Arguments{"tree", "--from", ""}, Arguments{"--from", "", "tree"},
+          Arguments{"list", "--codes", ""}, Arguments{"list", "--library", ""},
+          Arguments{"events", "--state", ""}, Arguments{"events", "--exec", ""},
+          Arguments{"health", "--policy", ""}, Arguments{"snapshot", ""}, Arguments{"diff", ""},
+          Arguments{"diff", "before", ""}, Arguments{"record", ""}}) {
+        EXPECT_THAT(complaint(wrong), HasSubstr("is empty")) << testing::PrintToString(wrong);
+    }
+    EXPECT_THAT(complaint({"list", ""}), HasSubstr("is no kind of record"));
+}
+
 TEST(Options, ExplainThemselves) {
     EXPECT_THAT(information({"--help"}), HasSubstr("130 interrupted"));
     EXPECT_THAT(information({"--version"}), testing::StartsWith("raidinfo "));
