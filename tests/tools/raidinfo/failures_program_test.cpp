@@ -108,6 +108,17 @@ TEST(FailingProgram, RefusesAWrongCommandLine) {
     expectFailure(run({"list", "--jsn"}), 64, "--jsn");
 }
 
+TEST(FailingProgram, RefusesAWrongFilterBeforeItAsksTheService) {
+    expectFailure(run({"list", "disk_drives", "--filter", "nokey=1"}), 64, "nokey");
+    expectFailure(run({"list", "--filter", "overall_status=Bogus"}), 64, "Critical or unknown");
+}
+
+// A monitoring system learns from 64 that nobody has looked at the machine.
+TEST(FailingProgram, RefusesAWrongCommandLineAlsoWhereItHasStatusesOfItsOwn) {
+    expectFailure(run({"health", "--nagios", "--bogus"}), 64, "--bogus");
+    expectFailure(run({"diff"}), 64, "before");
+}
+
 TEST(FailingProgram, SaysThatItsOutputCannotBeWritten) {
     const ScriptedService service{{answering(configuration(""))}};
     expectFailure(

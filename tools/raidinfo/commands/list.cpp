@@ -52,8 +52,9 @@ int runCommand(const Session& session, const ListOptions& list) {
     const std::vector<const Kind*> kinds = kindsOf(list);
     const bool json = session.options().json;
     for (const Kind* const kind : kinds) {
-        // What is wrong with the columns is said before anybody is asked.
+        // What is wrong with the command line is said before anybody is asked.
         static_cast<void>(chosenColumns(columnsOf(list, json), *kind));
+        checkFilters(list.filters, *kind);
     }
     const Trees trees = session.inventory();
     auto lists = Json::object();

@@ -17,6 +17,9 @@ namespace {
 using Comparison = Filter::Comparison;
 
 // Those of two characters first.
+constexpr auto statusWords =
+    std::to_array<std::string_view>({"Normal", "Warning", "Critical", "unknown"});
+
 constexpr auto operators = std::to_array<std::pair<std::string_view, Comparison>>({
     {"!=", Comparison::notEqual},
     {"<=", Comparison::atMost},
@@ -106,12 +109,23 @@ bool fulfils(const Value& value, const Filter& filter) {
         value);
 }
 
+Shape shapeOf(const ListColumn& column) {
+    if (column.key == "position") {
+        return Shape::number;
+    }
+    return column.field == nullptr ? Shape::text : column.field->shape;
+}
+
 /// Fails for a value that no record of the column could be compared with.
 void check(const Filter& filter, const ListColumn& column) {
-    const Shape shape = column.field == nullptr ? Shape::text : column.field->shape;
+    const Shape shape = shapeOf(column);
     const bool contains = filter.comparison == Comparison::contains;
     if (shape == Shape::flag) {
         static_cast<void>(flagIn(filter));
+    } else if (shape == Shape::statusText) {
+        if (!contains && std::ranges::find(statusWords, filter.value) == statusWords.end()) {
+            throw incomparable(filter, "which is Normal, Warning, Critical or unknown");
+        }
     } else if ((shape == Shape::numbers) == contains &&
                (shape == Shape::number || shape == Shape::constant || shape == Shape::numbers)) {
         static_cast<void>(numberIn(filter));
@@ -144,14 +158,22 @@ bool concerns(const Filter& filter, const Kind& kind) noexcept {
            std::ranges::any_of(kind.fromTree, hasKey);
 }
 
-Listing filtered(Listing listing, const std::vector<Filter>& filters) {
+void checkFilters(const std::vector<Filter>& filters, const Kind& kind) {
+    const std::vector<ListColumn> columns = columnsOf(kind);
     for (const Filter& filter : filters) {
-        const auto column = columnOf(filter, listing.columns);
-        if (column == listing.columns.end()) {
+        const auto column = columnOf(filter, columns);
+        if (column == columns.end()) {
             throw Failure{ExitStatus::usage,
-                          std::string{listing.kind->key} + " has no column \"" + filter.key + "\""};
+                          std::string{kind.key} + " has no column \"" + filter.key + "\""};
         }
         check(filter, *column);
+    }
+}
+
+Listing filtered(Listing listing, const std::vector<Filter>& filters) {
+    checkFilters(filters, *listing.kind);
+    for (const Filter& filter : filters) {
+        const auto column = columnOf(filter, listing.columns);
         const auto index = static_cast<std::size_t>(column - listing.columns.begin());
         std::erase_if(listing.rows, [index, &filter](const std::vector<Value>& row) {
             return !fulfils(row[index], filter);

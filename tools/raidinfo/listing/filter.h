@@ -31,10 +31,13 @@ struct Filter {
 /// Whether the kind has the column that the filter looks at.
 [[nodiscard]] bool concerns(const Filter& filter, const Kind& kind) noexcept;
 
+/// What no record of the kind could be compared with is a usage Failure, as is a column that the
+/// kind does not have. The values of what only the tree knows are for `filtered` to look at.
+void checkFilters(const std::vector<Filter>& filters, const Kind& kind);
+
 /// The rows that fulfil all filters. Numbers compare as numbers, flags with yes, no, true, false, 1
 /// and 0, texts byte by byte, an unknown status as "unknown", lists of numbers number by number for
-/// "~" and as they are shown otherwise. A value that cannot be compared with the column, and a
-/// column that the kind does not have, are usage Failures.
+/// "~" and as they are shown otherwise. Fails as checkFilters does.
 [[nodiscard]] Listing filtered(Listing listing, const std::vector<Filter>& filters);
 
 }  // namespace raidinfo

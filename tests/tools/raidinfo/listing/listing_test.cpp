@@ -102,7 +102,9 @@ TEST_F(DriveListing, IsFilteredByAllConditionsTogether) {
 }
 
 TEST_F(DriveListing, RefusesAFilterThatMakesNoSense) {
-    for (const char* const wrong : {"speed=1", "state=many", "smart_error=perhaps"}) {
+    for (const char* const wrong :
+         {"speed=1", "state=many", "smart_error=perhaps", "overall_status=Bogus",
+          "overall_status!=normal", "position=last"}) {
         EXPECT_THROW(static_cast<void>(positionsWhere({wrong})), Failure) << wrong;
     }
 }
@@ -111,6 +113,10 @@ TEST_F(DriveListing, RefusesAValueOfTheWrongKindAlsoWhenThereIsNoRecord) {
     listing.rows.clear();
     EXPECT_THROW(static_cast<void>(positionsWhere({"state=many"})), Failure);
     EXPECT_THROW(static_cast<void>(positionsWhere({"smart_error=2"})), Failure);
+}
+
+TEST_F(DriveListing, IsFilteredByPartOfAStatus) {
+    EXPECT_THAT(positionsWhere({"overall_status~Crit"}), ElementsAre(Value{1}));
 }
 
 TEST_F(DriveListing, ShowsTheColumnsThatAreChosenInTheirOrder) {
@@ -128,6 +134,13 @@ TEST(Filter, IsReadFromItsText) {
     EXPECT_EQ(filter.value, "a=b");
     for (const char* const wrong : {"", "state", "=1", "state!1"}) {
         EXPECT_THROW(static_cast<void>(parseFilter(wrong)), Failure) << wrong;
+    }
+}
+
+TEST(Filter, IsCheckedWithoutAnyRecord) {
+    EXPECT_NO_THROW(checkFilters({parseFilter("overall_status=unknown")}, drives));
+    for (const char* const wrong : {"nokey=1", "state=many", "overall_status=Bogus"}) {
+        EXPECT_THROW(checkFilters({parseFilter(wrong)}, drives), Failure) << wrong;
     }
 }
 
