@@ -1,5 +1,6 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sys/socket.h>
 
 #include <filesystem>
 #include <nlohmann/json.hpp>
@@ -7,6 +8,7 @@
 #include "documents.h"
 #include "program.h"
 #include "support/scripted_service.h"
+#include "support/socket.h"
 
 namespace raidinfo::test {
 namespace {
@@ -17,6 +19,8 @@ using raid::test::Connection;
 using raid::test::End;
 using raid::test::newestEventDocument;
 using raid::test::ScriptedService;
+using raid::test::Socket;
+using raid::test::throwIfNegative;
 using testing::AllOf;
 using testing::ContainsRegex;
 using testing::HasSubstr;
@@ -59,6 +63,17 @@ TEST(DoctorCommand, GivesUpOnASilentService) {
     const Result result = run({"doctor", "--timeout", "1"});
     EXPECT_EQ(result.status, 69);
     EXPECT_THAT(result.output, ContainsRegex("Service answers +bad"));
+}
+
+// It has not even come to accept the connection, for others wait before it.
+TEST(DoctorCommand, GivesUpOnAServiceThatAcceptsNoConnection) {
+    const Socket service = Socket::listening();
+    throwIfNegative(listen(service.get(), 0), "shorten the queue");
+    const Socket first = Socket::connected();
+    const Result result = run({"doctor", "--timeout", "1"});
+    EXPECT_EQ(result.status, 69);
+    EXPECT_THAT(result.output, ContainsRegex("Service listens +bad +nothing on 127.0.0.1 port "
+                                             "34572: Connection timed out"));
 }
 
 TEST(DoctorCommand, TellsTheReadersOwnMessageOfAMalformedAnswer) {

@@ -10,6 +10,7 @@
 #include "presentation/text.h"
 #include "source/recorded.h"
 #include "source/service.h"
+#include "source/service_address.h"
 
 namespace raidinfo {
 
@@ -59,7 +60,7 @@ Source sourceOf(const Options& options) {
         return {"files", diff->before + ", " + diff->after};
     }
     return options.recording ? Source{"recording", options.recording->string()}
-                             : Source{"service", "127.0.0.1:34572"};
+                             : Source{"service", ServiceAddress::inShort()};
 }
 
 void complain(std::string message) {

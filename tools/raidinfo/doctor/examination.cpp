@@ -3,9 +3,11 @@
 #include <arpa/inet.h>
 #include <dlfcn.h>
 #include <netinet/in.h>
+#include <poll.h>
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <filesystem>
@@ -14,6 +16,7 @@
 
 #include "doctor/library_log.h"
 #include "inventory/kinds.h"
+#include "source/service_address.h"
 #include "system/alarm.h"
 #include "system/descriptor.h"
 
@@ -22,8 +25,9 @@ namespace {
 
 namespace fs = std::filesystem;
 using Outcome = Examined::Outcome;
+using Clock = std::chrono::steady_clock;
+using Deadline = std::optional<Clock::time_point>;
 
-constexpr int port = 34572;
 constexpr int bitsOfAByte = 8;
 
 /// A file that the library looks for beside the working directory.
@@ -64,20 +68,45 @@ Examined log(const Library& library) {
                               : (writable ? "" : ": " + std::generic_category().message(errno)))};
 }
 
-Examined listening() {
-    const Descriptor probe{socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC, 0), "cannot make a socket"};
+std::chrono::milliseconds leftUntil(Clock::time_point deadline) {
+    const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - Clock::now());
+    return std::max(left, std::chrono::milliseconds{0});
+}
+
+/// Waits for the connection that the socket has begun; returns what went wrong, or 0.
+int connectionError(const Descriptor& socket, const Deadline& deadline) {
+    pollfd watched{socket.get(), POLLOUT, 0};
+    const int ready =
+        poll(&watched, 1, deadline ? static_cast<int>(leftUntil(*deadline).count()) : -1);
+    if (ready <= 0) {
+        return ready == 0 ? ETIMEDOUT : errno;
+    }
+    int error = 0;
+    socklen_t size = sizeof error;
+    return getsockopt(socket.get(), SOL_SOCKET, SO_ERROR, &error, &size) == 0 ? error : errno;
+}
+
+/// A service whose queue of connections is full neither accepts nor refuses one.
+Examined listening(const Deadline& deadline) {
+    const Descriptor probe{socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0),
+                           "cannot make a socket"};
     sockaddr_in address{};
     address.sin_family = AF_INET;
-    address.sin_port = htons(port);
-    address.sin_addr.s_addr = htonl(INADDR_LOOPBACK);
-    const std::string where = "127.0.0.1 port " + std::to_string(port);
+    address.sin_port = htons(ServiceAddress::port);
+    inet_pton(AF_INET, ServiceAddress::host, &address.sin_addr);
     // NOLINTNEXTLINE(cppcoreguidelines-pro-type-reinterpret-cast): how sockets take addresses
-    if (connect(probe.get(), reinterpret_cast<const sockaddr*>(&address), sizeof address) == 0) {
-        return {"listening", "Service listens", Outcome::fine, where};
+    const auto* const target = reinterpret_cast<const sockaddr*>(&address);
+    int error = connect(probe.get(), target, sizeof address) == 0 ? 0 : errno;
+    if (error == EINPROGRESS) {
+        error = connectionError(probe, deadline);
     }
-    return {"listening", "Service listens", Outcome::bad,
-            "nothing on " + where + ": " + std::generic_category().message(errno),
-            ExitStatus::serviceUnavailable};
+    if (error == 0) {
+        return {"listening", "Service listens", Outcome::fine, ServiceAddress::inWords()};
+    }
+    return {
+        "listening", "Service listens", Outcome::bad,
+        "nothing on " + ServiceAddress::inWords() + ": " + std::generic_category().message(error),
+        ExitStatus::serviceUnavailable};
 }
 
 Examined answering(const Library& library) {
@@ -131,10 +160,11 @@ void examine(const Library& library, std::optional<std::chrono::milliseconds> li
         return found.outcome == Outcome::bad;
     };
     tell(loadedFile(library));
-    const Examined service = listening();
+    const Deadline deadline = limit ? Deadline{Clock::now() + *limit} : std::nullopt;
+    const Examined service = listening(deadline);
     std::optional<Alarm> alarm;
-    if (limit) {
-        alarm.emplace(*limit, library.function<void()>("cancelGetEvent"));
+    if (deadline) {
+        alarm.emplace(leftUntil(*deadline), library.function<void()>("cancelGetEvent"));
     }
     // The library reads its settings with the first exchange.
     const Examined answer = answering(library);

@@ -1,12 +1,13 @@
 #pragma once
 
 #include "exit_status.h"
+#include "source/service_address.h"
 
 namespace raidinfo {
 
 [[nodiscard]] inline Failure serviceUnavailable() {
     return {ExitStatus::serviceUnavailable,
-            "the RAID management service on 127.0.0.1 port 34572 does not answer"};
+            "the RAID management service on " + ServiceAddress::inWords() + " does not answer"};
 }
 
 [[nodiscard]] inline Failure malformedAnswer() {
