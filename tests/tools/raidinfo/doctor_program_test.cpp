@@ -74,6 +74,7 @@ TEST(DoctorCommand, GivesUpOnAServiceThatAcceptsNoConnection) {
     EXPECT_EQ(result.status, 69);
     EXPECT_THAT(result.output, ContainsRegex("Service listens +bad +nothing on 127.0.0.1 port "
                                              "34572: Connection timed out"));
+    EXPECT_THAT(result.output, testing::Not(HasSubstr("Service answers")));
 }
 
 TEST(DoctorCommand, TellsTheReadersOwnMessageOfAMalformedAnswer) {

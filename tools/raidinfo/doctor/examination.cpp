@@ -7,7 +7,6 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
-#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <filesystem>
@@ -26,7 +25,7 @@ namespace {
 namespace fs = std::filesystem;
 using Outcome = Examined::Outcome;
 using Clock = std::chrono::steady_clock;
-using Deadline = std::optional<Clock::time_point>;
+using Limit = std::optional<std::chrono::milliseconds>;
 
 constexpr int bitsOfAByte = 8;
 
@@ -68,16 +67,10 @@ Examined log(const Library& library) {
                               : (writable ? "" : ": " + std::generic_category().message(errno)))};
 }
 
-std::chrono::milliseconds leftUntil(Clock::time_point deadline) {
-    const auto left = std::chrono::ceil<std::chrono::milliseconds>(deadline - Clock::now());
-    return std::max(left, std::chrono::milliseconds{0});
-}
-
 /// Waits for the connection that the socket has begun; returns what went wrong, or 0.
-int connectionError(const Descriptor& socket, const Deadline& deadline) {
+int connectionError(const Descriptor& socket, const Limit& limit) {
     pollfd watched{socket.get(), POLLOUT, 0};
-    const int ready =
-        poll(&watched, 1, deadline ? static_cast<int>(leftUntil(*deadline).count()) : -1);
+    const int ready = poll(&watched, 1, limit ? static_cast<int>(limit->count()) : -1);
     if (ready <= 0) {
         return ready == 0 ? ETIMEDOUT : errno;
     }
@@ -87,7 +80,7 @@ int connectionError(const Descriptor& socket, const Deadline& deadline) {
 }
 
 /// A service whose queue of connections is full neither accepts nor refuses one.
-Examined listening(const Deadline& deadline) {
+Examined listening(const Limit& limit) {
     const Descriptor probe{socket(AF_INET, SOCK_STREAM | SOCK_CLOEXEC | SOCK_NONBLOCK, 0),
                            "cannot make a socket"};
     sockaddr_in address{};
@@ -98,7 +91,7 @@ Examined listening(const Deadline& deadline) {
     const auto* const target = reinterpret_cast<const sockaddr*>(&address);
     int error = connect(probe.get(), target, sizeof address) == 0 ? 0 : errno;
     if (error == EINPROGRESS) {
-        error = connectionError(probe, deadline);
+        error = connectionError(probe, limit);
     }
     if (error == 0) {
         return {"listening", "Service listens", Outcome::fine, ServiceAddress::inWords()};
@@ -160,11 +153,16 @@ void examine(const Library& library, std::optional<std::chrono::milliseconds> li
         return found.outcome == Outcome::bad;
     };
     tell(loadedFile(library));
-    const Deadline deadline = limit ? Deadline{Clock::now() + *limit} : std::nullopt;
-    const Examined service = listening(deadline);
+    const auto begun = Clock::now();
+    const Examined service = listening(limit);
+    const auto passed = std::chrono::floor<std::chrono::milliseconds>(Clock::now() - begun);
+    if (limit && passed >= *limit) {
+        tell(service);  // nothing ends the library's own wait for a connection
+        return;
+    }
     std::optional<Alarm> alarm;
-    if (deadline) {
-        alarm.emplace(leftUntil(*deadline), library.function<void()>("cancelGetEvent"));
+    if (limit) {
+        alarm.emplace(*limit - passed, library.function<void()>("cancelGetEvent"));
     }
     // The library reads its settings with the first exchange.
     const Examined answer = answering(library);
