@@ -42,7 +42,8 @@ int statusWith(const std::string& change, const std::vector<std::string>& argume
 
 int statusAfter(int signal) {
     const ScriptedService service{{Connection{.end = End::hold}}};
-    Program program{raidinfo({"tree"})};
+    // A shell's background job inherits that some signals are ignored.
+    Program program{{"/usr/bin/env", "--default-signal", RAIDINFO_PROGRAM, "tree"}};
     service.waitFor(0, Stage::answered);
     program.signal(signal);
     return program.finish().status;
@@ -102,7 +103,9 @@ const std::map<int, std::function<int()>> ways{
              .status;
      }},
     {76, statusOfMalformedAnswers},
+    {129, [] { return statusAfter(SIGHUP); }},
     {130, [] { return statusAfter(SIGINT); }},
+    {131, [] { return statusAfter(SIGQUIT); }},
     {143, [] { return statusAfter(SIGTERM); }},
 };
 

@@ -4,6 +4,8 @@
 #include <csignal>
 #include <nlohmann/json.hpp>
 #include <sstream>
+#include <utility>
+#include <vector>
 
 #include "program.h"
 #include "simulator.h"
@@ -13,6 +15,7 @@ namespace {
 
 using nlohmann::json;
 using testing::AllOf;
+using testing::ContainsRegex;
 using testing::EndsWith;
 using testing::HasSubstr;
 using testing::Not;
@@ -63,17 +66,42 @@ TEST(WatchCommand, WritesADocumentForEachChange) {
     EXPECT_GE(documents, 2);
 }
 
+constexpr auto enter = "\x1b[?1049h\x1b[?25l";
+constexpr auto leave = "\x1b[?25h\x1b[?1049l";
+
 // `script` gives it a terminal.
-TEST(WatchCommand, LeavesTheTerminalAsItWas) {
+std::vector<std::string> onATerminal(const std::string& command) {
+    return {"/usr/bin/env", "--default-signal", "TERM=xterm", "script",   "--quiet",
+            "--return",     "--command",        command,      "/dev/null"};
+}
+
+TEST(WatchCommand, LeavesTheTerminalAsItWasWhateverKeyEndsIt) {
     const Simulator simulator{"small-server.xml"};
-    Program watch{{"/usr/bin/env", "TERM=xterm", "script", "--quiet", "--return", "--command",
-                   RAIDINFO_PROGRAM " watch", "/dev/null"}};
+    for (const auto& [key, status] : {std::pair{"\x03", 130}, std::pair{"\x1c", 131}}) {
+        Program watch{onATerminal(RAIDINFO_PROGRAM " watch")};
+        watch.waitForOutput("Disk drive 3");
+        watch.send(key);
+        const Result result = watch.finish();
+        EXPECT_EQ(result.status, status);
+        EXPECT_THAT(result.output, StartsWith(enter));
+        EXPECT_THAT(result.output, EndsWith(leave));
+    }
+}
+
+// A shell with job control, for without one nobody could continue it.
+TEST(WatchCommand, GivesTheTerminalBackWhileItIsStopped) {
+    const Simulator simulator{"small-server.xml"};
+    Program watch{onATerminal("exec bash -c 'set -m; " RAIDINFO_PROGRAM
+                              " watch --interval 3600; echo stopped; fg >/dev/null'")};
     watch.waitForOutput("Disk drive 3");
+    watch.send("\x1a");
+    EXPECT_THAT(watch.waitForOutput(enter, 2),
+                ContainsRegex("\x1b\\[\\?1049l[^\x1b]*stopped[^\x1b]*\x1b\\[\\?1049h"));
+    watch.waitForOutput("Disk drive 3", 2);
     watch.send("\x03");
     const Result result = watch.finish();
     EXPECT_EQ(result.status, 130);
-    EXPECT_THAT(result.output, StartsWith("\x1b[?1049h\x1b[?25l"));
-    EXPECT_THAT(result.output, EndsWith("\x1b[?25h\x1b[?1049l"));
+    EXPECT_THAT(result.output, EndsWith(leave));
 }
 
 TEST(WatchCommand, DrawsNoPictureInPlaceOnATerminalThatCannot) {

@@ -4,6 +4,7 @@
 #include <sys/eventfd.h>
 #include <sys/signalfd.h>
 
+#include <algorithm>
 #include <array>
 #include <csignal>
 #include <cstdint>
@@ -12,12 +13,18 @@
 #include <thread>
 
 #include "exit_status.h"
+#include "system/terminal_guest.h"
 
 namespace raidinfo {
 namespace {
 
 /// Interrupts the worker's system calls; its handler does nothing.
 constexpr int wakeSignal = SIGUSR1;
+
+bool isIgnored(int signal) {
+    struct sigaction present = {};
+    return sigaction(signal, nullptr, &present) == 0 && present.sa_handler == SIG_IGN;
+}
 
 int openSignals() {
     struct sigaction ignore = {};
@@ -27,31 +34,73 @@ int openSignals() {
     sigemptyset(&set);
     sigaddset(&set, SIGINT);
     sigaddset(&set, SIGTERM);
+    // Whoever started the program may not want it to be ended or stopped by these: nohup, say.
+    for (const int signal : {SIGHUP, SIGQUIT, SIGTSTP}) {
+        if (!isIgnored(signal)) {
+            sigaddset(&set, signal);
+        }
+    }
     pthread_sigmask(SIG_BLOCK, &set, nullptr);
     return signalfd(-1, &set, SFD_CLOEXEC);
-}
-
-int milliseconds(std::optional<std::chrono::milliseconds> limit) {
-    return limit ? static_cast<int>(limit->count()) : -1;
-}
-
-struct Readiness {
-    bool signalled;
-    bool finished;
-};
-
-Readiness waitFor(const Descriptor& signals, const Descriptor& finished, int timeout) {
-    std::array<pollfd, 2> watched{{{signals.get(), POLLIN, 0}, {finished.get(), POLLIN, 0}}};
-    if (poll(watched.data(), watched.size(), timeout) <= 0) {
-        return {false, false};
-    }
-    return {watched[0].revents != 0, watched[1].revents != 0};
 }
 
 int takeSignal(const Descriptor& signals) {
     signalfd_siginfo info{};
     const auto size = ::read(signals.get(), &info, sizeof info);
     return size == sizeof info ? static_cast<int>(info.ssi_signo) : SIGINT;
+}
+
+/// Stops the program as SIGTSTP does by itself; returns when it goes on.
+void stopProgram() {
+    leaveTerminal();
+    sigset_t set;
+    sigemptyset(&set);
+    sigaddset(&set, SIGTSTP);
+    raise(SIGTSTP);
+    pthread_sigmask(SIG_UNBLOCK, &set, nullptr);
+    pthread_sigmask(SIG_BLOCK, &set, nullptr);
+    enterTerminal();
+}
+
+using Clock = std::chrono::steady_clock;
+using Deadline = std::optional<Clock::time_point>;
+
+Deadline after(std::optional<std::chrono::milliseconds> limit) {
+    return limit ? Deadline{Clock::now() + *limit} : std::nullopt;
+}
+
+int millisecondsUntil(const Deadline& deadline) {
+    if (!deadline) {
+        return -1;
+    }
+    const auto left = std::chrono::ceil<std::chrono::milliseconds>(*deadline - Clock::now());
+    return std::max(0, static_cast<int>(left.count()));
+}
+
+struct Happening {
+    std::optional<int> signal = std::nullopt;
+    bool finished = false;
+};
+
+/// The next thing that happens before the deadline, if anything.
+Happening waitFor(const Descriptor& signals, const Descriptor& finished, const Deadline& deadline) {
+    while (true) {
+        std::array<pollfd, 2> watched{{{signals.get(), POLLIN, 0}, {finished.get(), POLLIN, 0}}};
+        const int ready = poll(watched.data(), watched.size(), millisecondsUntil(deadline));
+        if (ready == 0) {
+            return {};
+        }
+        if (ready > 0 && watched[0].revents == 0) {
+            return {.finished = true};
+        }
+        if (ready > 0) {
+            const int signal = takeSignal(signals);
+            if (signal != SIGTSTP) {
+                return {signal, watched[1].revents != 0};
+            }
+            stopProgram();
+        }
+    }
 }
 
 }  // namespace
@@ -74,18 +123,16 @@ Ending CancellableRun::run(const std::function<void(std::stop_token)>& work,
         }
         eventfd_write(finished.get(), 1);
     }};
-    const Readiness first = waitFor(signals, finished, milliseconds(limit));
-    Ending ending{.timedOut = !first.finished && !first.signalled};
-    if (first.signalled) {
-        ending.signal = takeSignal(signals);
-    }
+    const Happening first = waitFor(signals, finished, after(limit));
+    const Ending ending{.timedOut = !first.finished && !first.signal, .signal = first.signal};
     worker.request_stop();
-    for (Readiness now = first; !now.finished;) {
+    for (Happening now = first; !now.finished;) {
         cancel();
         wake(worker.native_handle());
-        now = waitFor(signals, finished, static_cast<int>(cancelInterval.count()));
-        if (now.signalled) {
-            std::_Exit(signalExitBase + takeSignal(signals));
+        now = waitFor(signals, finished, after(cancelInterval));
+        if (now.signal) {
+            abandonTerminal();
+            std::_Exit(signalExitBase + *now.signal);
         }
     }
     worker.join();

@@ -24,15 +24,16 @@ struct Ending {
 };
 
 /// Runs work that blocks in the library on a thread of its own, and ends it early on SIGINT,
-/// SIGTERM or a time limit. Make it before the first other thread: it blocks both signals.
+/// SIGTERM, SIGHUP, SIGQUIT or a time limit. SIGTSTP stops the program when the guest of its
+/// terminal has left that. Make it before the first other thread: it blocks all these signals.
 class CancellableRun {
 public:
     CancellableRun();
 
     /// Runs `work`; what it throws is thrown here unless it was ended early. To end it, `cancel` is
     /// called again and again until the work has ended, since the library may lose a cancel, and
-    /// each time a signal interrupts the system call that the work waits in. A second SIGINT or
-    /// SIGTERM meanwhile ends the program at once.
+    /// each time a signal interrupts the system call that the work waits in. A second of the
+    /// signals that end it ends the program at once; the guest of its terminal abandons that.
     Ending run(const std::function<void(std::stop_token)>& work,
                const std::function<void()>& cancel, std::optional<std::chrono::milliseconds> limit);
 

@@ -1,15 +1,19 @@
 #include "watch/screen.h"
 
+#include <poll.h>
+#include <unistd.h>
+
 #include <algorithm>
 #include <exception>
+#include <string_view>
 
 #include "presentation/text.h"
 
 namespace raidinfo {
 namespace {
 
-constexpr auto enter = "\x1b[?1049h\x1b[?25l";
-constexpr auto leave = "\x1b[?25h\x1b[?1049l";
+constexpr std::string_view enterSequence = "\x1b[?1049h\x1b[?25l";
+constexpr std::string_view leaveSequence = "\x1b[?25h\x1b[?1049l";
 constexpr auto home = "\x1b[H";
 constexpr auto restOfLine = "\x1b[K";
 constexpr auto restOfScreen = "\x1b[J";
@@ -21,17 +25,52 @@ Screen::Screen(const Output& destination, ColorChoice choice)
       colors{choice},
       inPlace{terminalOf(destination.descriptor(), choice).cursorMoves} {
     if (inPlace) {
-        output.write(enter);
+        guest.emplace(TerminalActs{.leave = [this] { leave(); },
+                                   .enter = [this] { enter(); },
+                                   .abandon = [this] { abandon(); }});
+        output.write(enterSequence);
     }
 }
 
 Screen::~Screen() {
     if (inPlace) {
-        try {
-            output.write(leave);
-        } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
-            // A terminal that is gone needs no tidying.
-        }
+        const std::scoped_lock lock{drawing};
+        inPlace = false;
+        write(leaveSequence);
+    }
+}
+
+void Screen::write(std::string_view text) const noexcept {
+    try {
+        output.write(text);
+    } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
+        // A terminal that is gone needs no tidying.
+    }
+}
+
+void Screen::leave() noexcept {
+    const std::scoped_lock lock{drawing};
+    if (inPlace) {
+        isAway = true;
+        write(leaveSequence);
+    }
+}
+
+void Screen::enter() noexcept {
+    const std::scoped_lock lock{drawing};
+    if (inPlace) {
+        isAway = false;
+        write(enterSequence);
+        write(picture);
+    }
+}
+
+/// Takes no lock, for the thread that has it may hang; nor does it wait for the terminal.
+void Screen::abandon() const noexcept {
+    pollfd terminal{output.descriptor(), POLLOUT, 0};
+    if (poll(&terminal, 1, 0) > 0) {
+        [[maybe_unused]] const ssize_t written =
+            ::write(terminal.fd, leaveSequence.data(), leaveSequence.size());
     }
 }
 
@@ -44,7 +83,7 @@ void Screen::show(const std::vector<ScreenLine>& lines) {
     }
 }
 
-void Screen::showInPlace(const std::vector<ScreenLine>& lines, const Terminal& terminal) const {
+void Screen::showInPlace(const std::vector<ScreenLine>& lines, const Terminal& terminal) {
     const Painter painter{terminal.colors};
     const std::size_t room = std::max<std::size_t>(terminal.height.value_or(0), 2);
     const std::size_t shown = lines.size() > room ? room - 1 : lines.size();
@@ -57,7 +96,11 @@ void Screen::showInPlace(const std::vector<ScreenLine>& lines, const Terminal& t
     if (shown < lines.size()) {
         text += "\r\n" + std::to_string(lines.size() - shown) + " more lines" + restOfLine;
     }
-    output.write(text + restOfScreen);
+    const std::scoped_lock lock{drawing};
+    picture = text + restOfScreen;
+    if (!isAway) {
+        output.write(picture);
+    }
 }
 
 void Screen::showBelow(const std::vector<ScreenLine>& lines, const Terminal& terminal) {

@@ -7,9 +7,14 @@
 #include <atomic>
 #include <cerrno>
 #include <csignal>
+#include <cstdlib>
+#include <functional>
 #include <future>
 #include <stdexcept>
+#include <string_view>
 #include <utility>
+
+#include "system/terminal_guest.h"
 
 namespace raidinfo {
 namespace {
@@ -68,7 +73,9 @@ TEST(CancellableRun, InterruptsTheSystemCallThatTheWorkWaitsIn) {
 }
 
 TEST(CancellableRun, ReportsTheSignalThatEndedIt) {
-    for (const int signal : {SIGINT, SIGTERM}) {
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP, SIGQUIT}) {
+        // As a shell's background job the test would have inherited that some are ignored.
+        std::signal(signal, SIG_DFL);
         CancellableRun run;
         std::promise<void> cancelled;
         const Ending ending = run.run(
@@ -86,6 +93,37 @@ TEST(CancellableRun, ReportsTheSignalThatEndedIt) {
         EXPECT_EQ(ending.signal, signal);
         EXPECT_FALSE(ending.timedOut);
     }
+}
+
+TEST(CancellableRun, HeedsThatAHangupIsIgnored) {
+    std::signal(SIGHUP, SIG_IGN);
+    const Ending ending =
+        CancellableRun{}.run([](const std::stop_token&) { kill(getpid(), SIGHUP); }, noCancel, {});
+    std::signal(SIGHUP, SIG_DFL);
+    EXPECT_FALSE(ending.signal);
+}
+
+std::function<void()> saying(std::string_view text) {
+    return [text] { static_cast<void>(!write(STDERR_FILENO, text.data(), text.size())); };
+}
+
+[[noreturn]] void runUntilASecondSignal() {
+    const TerminalGuest guest{{saying("left"), saying("entered"), saying("abandoned")}};
+    CancellableRun run;
+    run.run(
+        [](const std::stop_token&) {
+            kill(getpid(), SIGINT);
+            while (true) {
+                pause();
+            }
+        },
+        [] { kill(getpid(), SIGINT); }, {});
+    std::abort();
+}
+
+TEST(CancellableRun, AbandonsTheTerminalAtASecondSignal) {
+    GTEST_FLAG_SET(death_test_style, "threadsafe");
+    EXPECT_EXIT(runUntilASecondSignal(), testing::ExitedWithCode(128 + SIGINT), "^abandoned$");
 }
 
 TEST(CancellableRun, IsEndedAtOnceByASecondSignal) {
