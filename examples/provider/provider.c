@@ -51,8 +51,13 @@ static void* followEvents(void* output) {
     int last = -1;
     while (!stopping) {
         int fresh = 0;
-        if (last < 0 && enableRAIDEvent()) {
-            last = nextSequenceNumber; /* the newest there is; we want what comes after it */
+        if (enableRAIDEvent()) {
+            const int newest = nextSequenceNumber;
+            if (last < 0) {
+                last = newest; /* we want what comes after it */
+            } else if (newest < last) {
+                last = 0; /* the service was restarted and counts anew */
+            }
         }
         if (last >= 0) {
             setRAIDEventSequenceNumber(last + 1);

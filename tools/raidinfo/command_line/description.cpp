@@ -325,9 +325,10 @@ Description::Description()
         ->take_last();
     for (const Subcommand& subcommand : subcommands) {
         CLI::App* const app = parser->add_subcommand(subcommand.name, subcommand.summary);
-        app->footer(std::string{subcommand.examples} +
-                    "\nOptions that all subcommands have: raidinfo --help");
         subcommand.declare(*app, words);
+        const CLI::Option* const kind = app->get_option_no_throw("kind");
+        app->footer((kind == nullptr ? "" : "Kinds: " + kindNames() + "\n") + subcommand.examples +
+                    "\nOptions that all subcommands have: raidinfo --help");
     }
 }
 
