@@ -83,7 +83,9 @@ def raidinfos_table() -> dict[str, tuple[str, dict[str, tuple[str, str]]]]:
         for name, rows in re.findall(r"constexpr auto (\w+Fields) = .*?\(\{(.*?)\}\);", code, re.S)
     }
     kinds = re.findall(
-        rf"\{{KindId::\w+,{text},{text},{text},{text},{text},\s*(\w+Fields)(?:,\s*\w+)?\}}", code, re.S
+        rf"\{{KindId::\w+,{text},{text},{text},{text},{text},\s*(\w+Fields)(?:,\s*\w+)?\}}",
+        code,
+        re.S,
     )
     return {key: (count, fields[name]) for count, key, _, _, _, name in kinds}
 

@@ -5,7 +5,6 @@
 #include <unistd.h>
 
 #include <optional>
-#include <ranges>
 #include <string>
 
 #include "exit_status.h"
@@ -67,18 +66,14 @@ recording::Recording readRecording(const std::filesystem::path& path) {
 
 Inventory recordedInventory(const Library& library, const recording::Recording& recorded) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
-    const auto answers = [](const recording::Entry& entry) {
-        return entry.question == Question::configuration && entry.body;
-    };
     bool isAnswered = false;
     bool isRead = false;
-    for (const recording::Entry& entry :
-         recorded.entries | std::views::reverse | std::views::filter(answers)) {
-        isAnswered = true;
-        readSaved(library, readConfiguration, *entry.body);
-        isRead = *system != nullptr;
-        if (isRead) {
-            break;
+    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend() && !isRead;
+         ++entry) {
+        if (entry->question == Question::configuration && entry->body) {
+            isAnswered = true;
+            readSaved(library, readConfiguration, *entry->body);
+            isRead = *system != nullptr;
         }
     }
     if (!isAnswered) {
