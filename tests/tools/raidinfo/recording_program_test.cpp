@@ -298,6 +298,19 @@ TEST_F(Recording, OfAMalformedAnswerIsMalformed) {
     EXPECT_THAT(result.errors, HasSubstr("malformed"));
 }
 
+TEST_F(Recording, ShowsTheEventsOfAServiceThatBeganToCountAnew) {
+    std::ofstream recording{file};
+    recording << "raid-recording 1 2026-11-21T17:48:00Z\n";
+    for (const std::string& body : {eventBatch({7, 8}), otherEventBatch({1, 2}), eventBatch({3})}) {
+        recording << "answer 0 events " << body.size() << '\n' << body << '\n';
+    }
+    recording.close();
+    const Result result = run(from({"events"}));
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.errors, testing::MatchesRegex("raidinfo: [^\n]* count anew\n"));
+    EXPECT_THAT(result.output, testing::ContainsRegex("7  .*\n8  .*\n1  .*\n2  .*\n3  "));
+}
+
 TEST_F(Recording, ThatIsNoneIsRefused) {
     std::ofstream{file} << "something else\n";
     const Result result = run(from({"list"}));

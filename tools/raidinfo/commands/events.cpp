@@ -17,8 +17,9 @@ namespace {
 /// Shows events, hands them to the hook and keeps account of them.
 class Presentation {
 public:
-    Presentation(const Session& shownIn, const EventsOptions& chosen)
-        : session{shownIn}, options{chosen} {}
+    Presentation(const Session& shownIn, const EventsOptions& chosen,
+                 const std::optional<LastShown>& shownBefore)
+        : session{shownIn}, options{chosen}, last{shownBefore} {}
 
     bool show(const Record& event) {
         if (session.options().json) {
@@ -97,7 +98,12 @@ void showRecorded(const Session& session, const StreamStart& start, const EventL
             continue;
         }
         const auto batch = eventsIn(session.library(), reader, *entry.body);
-        if (batch && !showBatch(continuity, *batch, listener)) {
+        if (!batch) {
+            continue;
+        }
+        const bool wentBack = continuity.last() && greatestNumber(*batch) < *continuity.last();
+        static_cast<void>(beginsAnew(continuity, *batch, wentBack, listener));
+        if (!showBatch(continuity, *batch, listener)) {
             return;
         }
     }
@@ -106,14 +112,15 @@ void showRecorded(const Session& session, const StreamStart& start, const EventL
 }  // namespace
 
 int runCommand(const Session& session, const EventsOptions& events) {
-    Presentation presentation{session, events};
+    const StreamStart start = startOf(events);
+    Presentation presentation{session, events, start.shownBefore};
     const EventListener listener{
         [&presentation](const Record& event) { return presentation.show(event); },
         [&presentation](const Notice& notice) { presentation.notice(notice); }};
     if (session.recorded()) {
-        showRecorded(session, startOf(events), listener);
+        showRecorded(session, start, listener);
     } else {
-        followEvents(session.library(), startOf(events), listener, session.stop());
+        followEvents(session.library(), start, listener, session.stop());
     }
     return 0;
 }

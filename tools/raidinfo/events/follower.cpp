@@ -23,15 +23,6 @@ std::string told(const MissingNumbers& missing) {
                                                std::to_string(missing.last) + " are missing";
 }
 
-std::int64_t greatestIn(const Records& events) {
-    std::int64_t greatest = 0;
-    for (const Record& event : events) {
-        greatest =
-            std::max<std::int64_t>(greatest, numberOf(eventKind(), event, "sequence_number"));
-    }
-    return greatest;
-}
-
 class Follower {
 public:
     Follower(const Library& library, const StreamStart& start, const EventListener& told)
@@ -110,18 +101,11 @@ private:
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to
     /// count anew, and what it has is asked for from the beginning.
     bool isContinued(const Records& records, bool wentBack, std::int64_t last) {
-        using History = Continuity::History;
-        const History history = continuity->compared(records);
-        if (history == History::different ||
-            (wentBack && history == History::unknown && !records.empty())) {
-            listener.notice(
-                {numbersWentBack, "the service no longer has the events that it had up to " +
-                                      std::to_string(last) + "; it has begun to count anew"});
-            continuity->beginAnew();
+        if (beginsAnew(*continuity, records, wentBack, listener)) {
             return false;
         }
-        if (wentBack && history == History::same) {
-            const std::int64_t greatest = greatestIn(records);
+        if (wentBack && !records.empty()) {
+            const std::int64_t greatest = greatestNumber(records);
             if (greatest < last) {
                 continuity->shrinkTo(greatest);
             } else {
@@ -194,6 +178,31 @@ private:
 };
 
 }  // namespace
+
+bool beginsAnew(Continuity& continuity, const Records& batch, bool wentBack,
+                const EventListener& listener) {
+    using History = Continuity::History;
+    const History history = continuity.compared(batch);
+    const bool contradicts = history == History::different;
+    const bool knowsNothing = wentBack && history == History::unknown && !batch.empty();
+    if (!continuity.last() || !(contradicts || knowsNothing)) {
+        return false;
+    }
+    listener.notice({numbersWentBack, "the service no longer has the events that it had up to " +
+                                          std::to_string(*continuity.last()) +
+                                          "; it has begun to count anew"});
+    continuity.beginAnew();
+    return true;
+}
+
+std::int64_t greatestNumber(const Records& batch) {
+    std::int64_t greatest = 0;
+    for (const Record& event : batch) {
+        greatest =
+            std::max<std::int64_t>(greatest, numberOf(eventKind(), event, "sequence_number"));
+    }
+    return greatest;
+}
 
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener) {
     const auto [fresh, missing] = continuity.accept(batch);

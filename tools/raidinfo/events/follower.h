@@ -41,6 +41,14 @@ struct StreamStart {
 void followEvents(const Library& library, const StreamStart& start, const EventListener& listener,
                   const std::stop_token& stop);
 
+/// Whether the batch is of a service that has begun to count anew, which is likely where the
+/// numbers went back. Then it is told, and the continuity begins anew.
+bool beginsAnew(Continuity& continuity, const Records& batch, bool wentBack,
+                const EventListener& listener);
+
+/// The greatest number in a batch, 0 if there is none.
+[[nodiscard]] std::int64_t greatestNumber(const Records& batch);
+
 /// Shows a batch; returns false when the listener has seen enough.
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener);
 
