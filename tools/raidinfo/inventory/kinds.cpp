@@ -227,16 +227,16 @@ constexpr auto eventFields = std::to_array<Field>({
 });
 
 constexpr auto adapterTreeFields = std::to_array<TreeField>({
-    {"adapter_type", "Adapter type", Summary::no},
+    {"adapter_type", "Adapter type", text},
 });
 
 constexpr auto diskDriveTreeFields = std::to_array<TreeField>({
-    {"device_id", "Device ID", chief},
-    {"hot_spare", "Hot spare", chief},
+    {"device_id", "Device ID", number, chief},
+    {"hot_spare", "Hot spare", flag, chief},
 });
 
 constexpr auto enclosurePartTreeFields = std::to_array<TreeField>({
-    {"index", "Index", chief},
+    {"index", "Index", number, chief},
 });
 
 constexpr auto allKinds = std::to_array<Kind>({

@@ -36,7 +36,8 @@ struct Field {
 struct TreeField {
     std::string_view key;
     std::string_view title;
-    Summary summary;
+    Shape shape;
+    Summary summary = Summary::no;
 };
 
 enum class KindId : std::uint8_t {

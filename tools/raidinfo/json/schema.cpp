@@ -20,6 +20,8 @@ Json reference(std::string_view name) {
 
 Json listOf(Json item) { return Json::object({{"type", "array"}, {"items", std::move(item)}}); }
 
+Json nullable(Json of) { return Json::object({{"anyOf", {std::move(of), type("null")}}}); }
+
 /// Members that must be there; with others as well where an object can have more.
 Json object(const std::vector<std::pair<std::string, Json>>& members, bool closed = true) {
     auto properties = Json::object();
@@ -106,8 +108,6 @@ Json findingSchema() {
                    {"outcome", Json::object({{"enum", {"ok", "look", "bad"}}})},
                    {"finding", type("string")}});
 }
-
-Json nullable(Json of) { return Json::object({{"anyOf", {std::move(of), type("null")}}}); }
 
 Json oneOf(std::initializer_list<const char*> words) {
     auto list = Json::array();

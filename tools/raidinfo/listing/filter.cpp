@@ -109,16 +109,9 @@ bool fulfils(const Value& value, const Filter& filter) {
         value);
 }
 
-Shape shapeOf(const ListColumn& column) {
-    if (column.key == "position") {
-        return Shape::number;
-    }
-    return column.field == nullptr ? Shape::text : column.field->shape;
-}
-
 /// Fails for a value that no record of the column could be compared with.
 void check(const Filter& filter, const ListColumn& column) {
-    const Shape shape = shapeOf(column);
+    const Shape shape = column.shape;
     const bool contains = filter.comparison == Comparison::contains;
     if (shape == Shape::flag) {
         static_cast<void>(flagIn(filter));

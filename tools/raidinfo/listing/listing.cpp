@@ -34,12 +34,14 @@ Value extraOf(const Extras* extras, std::string_view key) {
 }  // namespace
 
 std::vector<ListColumn> columnsOf(const Kind& kind) {
-    std::vector<ListColumn> columns{{"position", "#", nullptr, true}};
+    std::vector<ListColumn> columns{{"position", "#", nullptr, Shape::number, true}};
     for (const TreeField& field : kind.fromTree) {
-        columns.push_back({field.key, field.title, nullptr, field.summary != Summary::no});
+        columns.push_back(
+            {field.key, field.title, nullptr, field.shape, field.summary != Summary::no});
     }
     for (const Field& field : kind.fields) {
-        columns.push_back({field.key, field.title, &field, field.summary != Summary::no});
+        columns.push_back(
+            {field.key, field.title, &field, field.shape, field.summary != Summary::no});
     }
     return columns;
 }

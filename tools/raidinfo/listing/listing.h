@@ -15,7 +15,8 @@ struct ListColumn {
     std::string_view key;
     std::string_view title;
     const Field* field;  ///< null for the position and for what only the tree knows
-    bool chief;          ///< shown unless other columns are asked for
+    Shape shape;
+    bool chief;  ///< shown unless other columns are asked for
 };
 
 /// The records of a kind as rows: the position, what only the tree knows (such as a drive's device

@@ -18,19 +18,12 @@ std::string joined(const std::vector<int>& numbers) {
     return result;
 }
 
-bool isNumber(const Field& field) {
-    return field.shape == Shape::number || field.shape == Shape::constant;
-}
-
-bool holdsNumber(const Value& value) { return std::holds_alternative<int>(value); }
+bool isNumber(Shape shape) { return shape == Shape::number || shape == Shape::constant; }
 
 /// Numbers are, but not those with a name behind them.
-bool isToTheRight(const ListColumn& column, const Listing& listing, std::size_t index,
-                  const CodeBook::Meaning* meaning) {
-    return column.field == nullptr
-               ? !listing.rows.empty() && holdsNumber(listing.rows.front()[index])
-               : isNumber(*column.field) &&
-                     (meaning == nullptr || !std::holds_alternative<CodeBook::Codes>(*meaning));
+bool isToTheRight(const ListColumn& column, const CodeBook::Meaning* meaning) {
+    return isNumber(column.shape) &&
+           (meaning == nullptr || !std::holds_alternative<CodeBook::Codes>(*meaning));
 }
 
 }  // namespace
@@ -48,7 +41,7 @@ std::string shown(const Value& value) {
 }
 
 std::string shown(const Kind& kind, const Field& field, const Value& value, const CodeBook& book) {
-    return isNumber(field) ? book.shown(kind.key, field.key, value) : shown(value);
+    return isNumber(field.shape) ? book.shown(kind.key, field.key, value) : shown(value);
 }
 
 Style styleOf(const Value& value, const Field* field) {
@@ -74,8 +67,8 @@ std::string table(const Listing& listing, const GridLayout& layout, const CodeBo
         const ListColumn& listed = listing.columns[index];
         const CodeBook::Meaning* const meaning =
             listed.field == nullptr ? nullptr : book.find(listing.kind->key, listed.field->key);
-        GridColumn& column = columns.emplace_back(GridColumn{
-            std::string{listed.title}, isToTheRight(listed, listing, index, meaning), {}});
+        GridColumn& column = columns.emplace_back(
+            GridColumn{std::string{listed.title}, isToTheRight(listed, meaning), {}});
         column.cells.reserve(listing.rows.size());
         for (const std::vector<Value>& row : listing.rows) {
             column.cells.push_back({shown(row[index], meaning), styleOf(row[index], listed.field)});
