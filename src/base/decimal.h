@@ -10,7 +10,7 @@ namespace raid::base {
 [[nodiscard]] int anyDecimalNumber(std::string_view text) noexcept;
 
 /// The same, sooner where the text is what it is nearly always: a few digits.
-[[nodiscard, gnu::always_inline]] inline int decimalNumber(std::string_view text) noexcept {
+[[nodiscard]] inline int decimalNumber(std::string_view text) noexcept {
     if (text.size() > std::numeric_limits<int>::digits10) {
         return anyDecimalNumber(text);
     }

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <cstring>
 #include <string>
 #include <string_view>
 
@@ -57,12 +56,6 @@ template <class Model>
 inline constexpr Names namesOf{&numberOf<Model>, UsualTags<Model>::known,
                                TagIndex(UsualTags<Model>::beginnings)};
 
-/// A flag is set by exactly this text. In this form it takes one comparison wherever it stands.
-[[nodiscard, gnu::always_inline]] inline bool isTrue(std::string_view text) noexcept {
-    constexpr std::string_view word = "true";
-    return text.size() == word.size() && std::memcmp(text.data(), word.data(), word.size()) == 0;
-}
-
 template <class Model>
 void keepText(Model& model, const Child<Model>& child, std::string_view text) {
     switch (child.kind) {
@@ -70,7 +63,7 @@ void keepText(Model& model, const Child<Model>& child, std::string_view text) {
             model.*child.number = base::decimalNumber(text);
             break;
         case Child<Model>::Kind::flag:
-            model.*child.number = isTrue(text) ? 1 : 0;
+            model.*child.number = text == "true" ? 1 : 0;
             break;
         case Child<Model>::Kind::text:
             model.*child.text = text;
