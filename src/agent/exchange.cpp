@@ -32,6 +32,19 @@ constexpr std::size_t spareBytes = 10;
 using diag::agentLinkLevel;
 using diag::log;
 
+/// The result of the connect, which is an error when the exchange was told to give up. A service
+/// that hangs accepts nobody, and its queue is full sooner or later.
+int connectTo(const base::StreamSocket& socket) {
+    auto rc = socket.connect(serviceAddress, servicePort, waitSlice);
+    while (!rc) {
+        if (base::load(endFlag) != 0) {
+            return -1;
+        }
+        rc = socket.waitConnected(waitSlice);
+    }
+    return *rc;
+}
+
 /// False when the exchange was told to give up; there is no other limit.
 bool waitForData(const base::StreamSocket& socket) {
     while (socket.waitReadable(waitSlice) <= 0) {
@@ -107,7 +120,7 @@ Document exchange(const char* request) {
 
     base::StreamSocket socket;
     log(agentLinkLevel, "Socket handle=%d\n", socket.handle());
-    const int rc = socket.connect(serviceAddress, servicePort);
+    const int rc = connectTo(socket);
     log(agentLinkLevel, "Connect rc=%d\n", rc);
     if (rc < 0) {
         return nullptr;

@@ -4,6 +4,7 @@
 
 #include <chrono>
 #include <cstdint>
+#include <optional>
 #include <span>
 #include <string_view>
 
@@ -12,8 +13,8 @@
 namespace raid::base {
 
 /// One TCP connection over IPv4. Results are those of the system calls: negative for an error.
-/// A call that a signal interrupts before it did anything is repeated, except the wait, whose
-/// caller looks at its own flags first.
+/// A call that a signal interrupts before it did anything is repeated, except those that wait for
+/// a slice of time: their callers look at flags of their own first.
 class StreamSocket {
 public:
     /// A socket that could not be created shows as a negative handle and a failing connect.
@@ -21,7 +22,10 @@ public:
 
     [[nodiscard]] int handle() const noexcept { return descriptor.get(); }
 
-    [[nodiscard]] int connect(const char* address, std::uint16_t port) const noexcept;
+    /// Nothing while the connection is still on its way; then waitConnected goes on.
+    [[nodiscard]] std::optional<int> connect(const char* address, std::uint16_t port,
+                                             std::chrono::milliseconds slice) const noexcept;
+    [[nodiscard]] std::optional<int> waitConnected(std::chrono::milliseconds slice) const noexcept;
 
     /// Never raises SIGPIPE in the host.
     [[nodiscard]] ssize_t send(std::string_view bytes) const noexcept;

@@ -1,4 +1,4 @@
-// The wait for an answer and its end.
+// The wait for a connection and for an answer, and the end of both.
 
 #include <gtest/gtest.h>
 
@@ -6,6 +6,7 @@
 
 #include "exchanged.h"
 #include "support/blocked_call.h"
+#include "support/busy_service.h"
 #include "support/fresh_library.h"
 #include "support/open_descriptors.h"
 #include "support/scripted_service.h"
@@ -45,6 +46,27 @@ TEST_F(ExchangeWait, GoesOnAfterASignalUnlessItIsCancelled) {
     service.waitFor(0, Stage::requestRead);
     gate.open();
     EXPECT_EQ(blocked.interrupt(), "body");
+}
+
+// The exchange forgets a cancel that comes before it begins: it is repeated, as hosts must.
+TEST_F(ExchangeWait, ForAConnectionThatNobodyAcceptsEndsWhenItIsCancelled) {
+    const BusyService service;
+    expectOpenDescriptors(0);
+    BlockedCall blocked([] { return exchanged(); });
+    while (!blocked.returnsWithin(std::chrono::milliseconds{2})) {
+        disconnectSocket();
+        blocked.nudge();
+    }
+    EXPECT_EQ(blocked.wait(), std::nullopt);
+}
+
+TEST_F(ExchangeWait, ForAConnectionNoticesACancelAfterItsSlice) {
+    const BusyService service;
+    BlockedCall blocked([] { return exchanged(); });
+    while (!blocked.returnsWithin(std::chrono::milliseconds{100})) {
+        disconnectSocket();
+    }
+    EXPECT_EQ(blocked.wait(), std::nullopt);
 }
 
 TEST_F(ExchangeWait, ForgetsACancelOfAnEarlierExchange) {

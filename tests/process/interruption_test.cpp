@@ -15,6 +15,7 @@
 #include "diag/debug.h"
 #include "interrupted_calls.h"
 #include "signal_storm.h"
+#include "support/busy_service.h"
 #include "support/files.h"
 #include "support/fresh_library.h"
 #include "support/scripted_service.h"
@@ -81,15 +82,13 @@ TEST_F(Interruptions, LeaveAWaitForTheFirstByteWhole) {
 // The queue of the service is full, so that the connection comes about at the second attempt only,
 // a second later.
 TEST_F(Interruptions, LeaveASlowConnectWhole) {
-    const Socket listener = Socket::listening();
-    throwIfNegative(listen(listener.get(), 0), "shorten the queue");
-    const Socket filling = Socket::connected();
+    const BusyService service;
     const SignalStorm storm;
     std::jthread serving([&] {
         storm.waitFor(many);
-        throwIfNegative(listen(listener.get(), SOMAXCONN), "lengthen the queue");
-        const Socket filled(accept4(listener.get(), nullptr, nullptr, SOCK_CLOEXEC));
-        const Socket client(accept4(listener.get(), nullptr, nullptr, SOCK_CLOEXEC));
+        service.makeRoom();
+        const Socket filled = service.accept();
+        const Socket client = service.accept();
         std::array<char, 256> request{};
         throwIfNegative(recv(client.get(), request.data(), request.size(), 0), "receive");
         const std::string text = answer("body");

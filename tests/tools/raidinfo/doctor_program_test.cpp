@@ -1,14 +1,13 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
-#include <sys/socket.h>
 
 #include <filesystem>
 #include <nlohmann/json.hpp>
 
 #include "documents.h"
 #include "program.h"
+#include "support/busy_service.h"
 #include "support/scripted_service.h"
-#include "support/socket.h"
 
 namespace raidinfo::test {
 namespace {
@@ -67,9 +66,7 @@ TEST(DoctorCommand, GivesUpOnASilentService) {
 
 // It has not even come to accept the connection, for others wait before it.
 TEST(DoctorCommand, GivesUpOnAServiceThatAcceptsNoConnection) {
-    const Socket service = Socket::listening();
-    throwIfNegative(listen(service.get(), 0), "shorten the queue");
-    const Socket first = Socket::connected();
+    const BusyService service;
     const Result result = run({"doctor", "--timeout", "1"});
     EXPECT_EQ(result.status, 69);
     EXPECT_THAT(result.output, ContainsRegex("Service listens +bad +nothing on 127.0.0.1 port "

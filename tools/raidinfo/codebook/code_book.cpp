@@ -4,8 +4,9 @@
 #include <array>
 #include <utility>
 
-#include "presentation/table.h"
-#include "presentation/text.h"
+#include "inventory/value.h"
+#include "text/printable.h"
+
 
 namespace raidinfo {
 namespace {

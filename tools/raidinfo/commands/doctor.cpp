@@ -4,7 +4,7 @@
 #include "commands/commands.h"
 #include "doctor/examination.h"
 #include "exit_status.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo {
 namespace {

@@ -7,10 +7,10 @@
 #include <utility>
 
 #include "inventory/structure.h"
-#include "presentation/text.h"
 #include "source/recorded.h"
 #include "source/service.h"
 #include "source/service_address.h"
+#include "text/printable.h"
 
 namespace raidinfo {
 

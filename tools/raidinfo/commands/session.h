@@ -7,10 +7,10 @@
 
 #include "codebook/code_book.h"
 #include "command_line/options.h"
+#include "inventory/tree.h"
 #include "json/envelope.h"
 #include "presentation/grid.h"
 #include "presentation/terminal.h"
-#include "presentation/tree.h"
 #include "recording/recording.h"
 #include "source/inventory.h"
 #include "source/library.h"

@@ -22,7 +22,7 @@ std::string fieldTable(const Listing& record, const GridLayout& layout, const Co
         keys.cells.push_back({std::string{column.key}});
         values.cells.push_back({column.field == nullptr
                                     ? shown(value)
-                                    : shown(*record.kind, *column.field, value, book),
+                                    : book.shown(record.kind->key, column.key, value),
                                 styleOf(value, column.field)});
     }
     return drawn({titles, keys, values}, layout);

@@ -4,6 +4,7 @@
 
 #include "commands/commands.h"
 #include "inventory/structure.h"
+#include "inventory/tree.h"
 #include "json/json.h"
 
 namespace raidinfo {

@@ -6,7 +6,7 @@
 
 #include "diff/rules.h"
 #include "diff/values.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo::diff {
 namespace {

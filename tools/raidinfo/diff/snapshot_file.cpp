@@ -5,7 +5,7 @@
 #include <utility>
 
 #include "diff/entries.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo::diff {
 namespace {

@@ -6,8 +6,8 @@
 #include <vector>
 
 #include "inventory/records.h"
-#include "presentation/table.h"
-#include "presentation/text.h"
+#include "inventory/value.h"
+#include "text/printable.h"
 
 namespace raidinfo::diff {
 namespace {

@@ -1,6 +1,7 @@
 #include "events/event_line.h"
 
-#include "presentation/table.h"
+#include "inventory/value.h"
+
 
 namespace raidinfo {
 

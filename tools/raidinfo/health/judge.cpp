@@ -6,7 +6,8 @@
 
 #include "health/evidence.h"
 #include "health/vocabulary.h"
-#include "presentation/text.h"
+#include "text/decoded.h"
+#include "text/printable.h"
 
 namespace raidinfo::health {
 namespace {

@@ -3,7 +3,7 @@
 #include "codebook/code_book.h"
 #include "health/policy.h"
 #include "health/verdict.h"
-#include "presentation/tree.h"
+#include "inventory/tree.h"
 
 namespace raidinfo::health {
 

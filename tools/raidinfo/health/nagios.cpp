@@ -4,7 +4,7 @@
 #include <array>
 
 #include "health/report.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo::health {
 namespace {

@@ -8,8 +8,8 @@
 #include <vector>
 
 #include "health/vocabulary.h"
-#include "presentation/text.h"
 #include "settings/setting.h"
+#include "text/printable.h"
 
 namespace raidinfo::health {
 namespace {

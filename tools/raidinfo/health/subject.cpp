@@ -8,7 +8,7 @@
 
 #include "codebook/code_book.h"
 #include "health/vocabulary.h"
-#include "presentation/table.h"
+#include "inventory/value.h"
 
 namespace raidinfo::health {
 namespace {

@@ -6,7 +6,7 @@
 #include <vector>
 
 #include "inventory/records.h"
-#include "presentation/tree.h"
+#include "inventory/tree.h"
 
 namespace raidinfo::health {
 

@@ -4,7 +4,7 @@
 #include <string_view>
 #include <utility>
 
-#include "presentation/text.h"
+#include "text/decoded.h"
 
 namespace raidinfo {
 namespace {

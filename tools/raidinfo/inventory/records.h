@@ -4,22 +4,14 @@
 #include <cstddef>
 #include <optional>
 #include <string>
-#include <variant>
 #include <vector>
 
 #include "inventory/kinds.h"
+#include "inventory/value.h"
 #include "source/library.h"
 #include "source/text_buffer.h"
 
 namespace raidinfo {
-
-/// A status text that the library does not know, hence no text.
-struct UnknownStatus {
-    bool operator==(const UnknownStatus&) const = default;
-};
-
-/// A field as it was read, texts decoded.
-using Value = std::variant<int, bool, std::string, UnknownStatus, std::vector<int>>;
 
 /// The fields of one record, in the order of its kind's fields.
 using Record = std::vector<Value>;

@@ -8,7 +8,8 @@
 
 #include "exit_status.h"
 #include "model/system_and_adapter.h"
-#include "presentation/text.h"
+#include "text/decoded.h"
+#include "text/printable.h"
 
 namespace raidinfo {
 namespace {

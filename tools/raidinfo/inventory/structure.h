@@ -3,7 +3,7 @@
 #include <vector>
 
 #include "inventory/records.h"
-#include "presentation/tree.h"
+#include "inventory/tree.h"
 
 class RAIDAdapter;
 

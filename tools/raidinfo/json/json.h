@@ -4,8 +4,8 @@
 
 #include "inventory/kinds.h"
 #include "inventory/records.h"
+#include "inventory/tree.h"
 #include "listing/listing.h"
-#include "presentation/tree.h"
 
 namespace raidinfo {
 

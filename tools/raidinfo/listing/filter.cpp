@@ -8,8 +8,8 @@
 #include <utility>
 
 #include "exit_status.h"
+#include "inventory/value.h"
 #include "overloaded.h"
-#include "presentation/table.h"
 
 namespace raidinfo {
 namespace {

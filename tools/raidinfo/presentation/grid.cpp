@@ -4,7 +4,7 @@
 #include <cstddef>
 #include <span>
 
-#include "presentation/text.h"
+#include "text/width.h"
 
 namespace raidinfo {
 namespace {

@@ -4,19 +4,8 @@
 #include <utility>
 #include <vector>
 
-#include "overloaded.h"
-#include "presentation/text.h"
-
 namespace raidinfo {
 namespace {
-
-std::string joined(const std::vector<int>& numbers) {
-    std::string result;
-    for (const int number : numbers) {
-        result += (result.empty() ? "" : ",") + std::to_string(number);
-    }
-    return result;
-}
 
 bool isNumber(Shape shape) { return shape == Shape::number || shape == Shape::constant; }
 
@@ -27,22 +16,6 @@ bool isToTheRight(const ListColumn& column, const CodeBook::Meaning* meaning) {
 }
 
 }  // namespace
-
-std::string shown(const Value& value) {
-    return std::visit(
-        Overloaded{[](int number) { return std::to_string(number); },
-                   [](bool flag) { return std::string{flag ? "yes" : "no"}; },
-                   [](const std::string& text) { return text.empty() ? "-" : printable(text); },
-                   [](UnknownStatus) { return std::string{"unknown"}; },
-                   [](const std::vector<int>& numbers) {
-                       return numbers.empty() ? "-" : joined(numbers);
-                   }},
-        value);
-}
-
-std::string shown(const Kind& kind, const Field& field, const Value& value, const CodeBook& book) {
-    return isNumber(field.shape) ? book.shown(kind.key, field.key, value) : shown(value);
-}
 
 Style styleOf(const Value& value, const Field* field) {
     constexpr auto words = std::to_array<std::pair<std::string_view, Style>>(

@@ -3,18 +3,11 @@
 #include <string>
 
 #include "codebook/code_book.h"
-#include "inventory/records.h"
+#include "inventory/value.h"
 #include "listing/listing.h"
 #include "presentation/grid.h"
 
 namespace raidinfo {
-
-/// A value as people read it.
-[[nodiscard]] std::string shown(const Value& value);
-
-/// The value of a kind's field, with what it means beside a code or a size.
-[[nodiscard]] std::string shown(const Kind& kind, const Field& field, const Value& value,
-                                const CodeBook& book);
 
 /// The look of a value of a field, by what it says.
 [[nodiscard]] Style styleOf(const Value& value, const Field* field);

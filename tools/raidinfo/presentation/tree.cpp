@@ -4,7 +4,7 @@
 #include <utility>
 
 #include "presentation/table.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo {
 namespace {

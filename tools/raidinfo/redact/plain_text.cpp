@@ -3,7 +3,8 @@
 #include <algorithm>
 #include <cctype>
 
-#include "presentation/text.h"
+#include "text/decoded.h"
+
 
 namespace raidinfo::redact {
 namespace {

@@ -9,7 +9,7 @@
 #include <utility>
 
 #include "exit_status.h"
-#include "presentation/text.h"
+#include "text/printable.h"
 
 namespace raidinfo::settings {
 namespace {

@@ -3,7 +3,8 @@
 #include <utility>
 
 #include "exit_status.h"
-#include "presentation/text.h"
+#include "text/decoded.h"
+#include "text/printable.h"
 
 namespace raidinfo::settings {
 namespace {

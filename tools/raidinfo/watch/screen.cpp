@@ -7,7 +7,8 @@
 #include <exception>
 #include <string_view>
 
-#include "presentation/text.h"
+#include "text/width.h"
+
 
 namespace raidinfo {
 namespace {

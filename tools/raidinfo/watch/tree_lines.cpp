@@ -5,6 +5,8 @@
 #include <unordered_map>
 #include <utility>
 
+#include "presentation/tree.h"
+
 namespace raidinfo {
 namespace {
 

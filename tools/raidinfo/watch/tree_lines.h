@@ -4,7 +4,8 @@
 #include <string>
 #include <vector>
 
-#include "presentation/tree.h"
+#include "codebook/code_book.h"
+#include "inventory/tree.h"
 #include "watch/screen.h"
 
 namespace raidinfo {

@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "inventory/tree.h"
 #include "sample.h"
 
 namespace raidinfo {

@@ -1,4 +1,4 @@
-#include "presentation/text.h"
+#include "text/decoded.h"
 
 #include <gtest/gtest.h>
 
@@ -44,29 +44,6 @@ TEST(DecodedText, ReplacesBytesThatAreNotUtf8) {
         << "cut short";
     EXPECT_EQ(decoded("\xE2\x82"), "\uFFFD") << "cut short by the end";
     EXPECT_EQ(decoded("\xFF&amp;\xFE"), "\uFFFD&\uFFFD");
-}
-
-TEST(PrintableText, EscapesControlCharacters) {
-    EXPECT_EQ(printable("a\tb\nc"), "a\\u{9}b\\u{a}c");
-    EXPECT_EQ(printable("\x1B[2J\x7F"), "\\u{1b}[2J\\u{7f}");
-    EXPECT_EQ(printable("\u009B2J"), "\\u{9b}2J") << "the one-character form of ESC [";
-    EXPECT_EQ(printable("\u202Eabc\u2066"), "\\u{202e}abc\\u{2066}") << "reverses what follows";
-    EXPECT_EQ(printable("é 日本"), "é 日本");
-}
-
-TEST(TitleInASentence, BeginsSmallUnlessItIsAnAbbreviation) {
-    EXPECT_EQ(inSentence("Physical slot"), "physical slot");
-    EXPECT_EQ(inSentence("SMART error"), "SMART error");
-    EXPECT_EQ(inSentence(""), "");
-}
-
-TEST(DisplayWidth, CountsColumnsOfTheTerminal) {
-    EXPECT_EQ(displayWidth(""), 0U);
-    EXPECT_EQ(displayWidth("abc"), 3U);
-    EXPECT_EQ(displayWidth("40 °C"), 5U);
-    EXPECT_EQ(displayWidth("日本"), 4U);
-    EXPECT_EQ(displayWidth("e\u0301"), 1U) << "a combining accent";
-    EXPECT_EQ(displayWidth("\uFFFD"), 1U);
 }
 
 }  // namespace
