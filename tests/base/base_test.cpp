@@ -6,7 +6,9 @@
 #include <sys/resource.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <climits>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -15,6 +17,7 @@
 #include "base/file_descriptor.h"
 #include "base/regular_file.h"
 #include "base/stream_socket.h"
+#include "support/busy_service.h"
 #include "support/files.h"
 
 namespace {
@@ -114,11 +117,13 @@ TEST(RegularFile, RefusesEverythingElseWithoutWaiting) {
     EXPECT_FALSE(RegularFile::open("pipe"));
 }
 
+constexpr std::chrono::milliseconds slice{5};
+
 TEST(StreamSocket, FailsToConnectWhereNobodyListens) {
     const StreamSocket socket;
     EXPECT_GE(socket.handle(), 0);
     EXPECT_NE(fcntl(socket.handle(), F_GETFD) & FD_CLOEXEC, 0) << "no child inherits it";
-    EXPECT_LT(socket.connect("127.0.0.1", 1), 0);
+    EXPECT_LT(socket.connect("127.0.0.1", 1, slice), 0);
 }
 
 TEST(StreamSocket, FailsToConnectWhenNoDescriptorIsLeft) {
@@ -128,8 +133,33 @@ TEST(StreamSocket, FailsToConnectWhenNoDescriptorIsLeft) {
     ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &none), 0);
     const StreamSocket socket;
     EXPECT_LT(socket.handle(), 0);
-    EXPECT_LT(socket.connect("127.0.0.1", 1), 0);
+    EXPECT_LT(socket.connect("127.0.0.1", 1, slice), 0);
     ASSERT_EQ(setrlimit(RLIMIT_NOFILE, &before), 0);
+}
+
+TEST(StreamSocket, WaitsForAConnectionInSlices) {
+    const BusyService service;
+    const StreamSocket socket;
+    EXPECT_EQ(socket.connect("127.0.0.1", 34572, slice), std::nullopt);
+    EXPECT_EQ(socket.waitConnected(slice), std::nullopt);
+    service.makeRoom();
+    std::optional<int> rc;
+    while (!rc) {
+        rc = socket.waitConnected(slice);  // the kernel asks the service again after a second
+    }
+    EXPECT_EQ(rc, 0);
+}
+
+TEST(StreamSocket, LearnsThatItsConnectionWasRefused) {
+    std::optional<BusyService> service{std::in_place};
+    const StreamSocket socket;
+    ASSERT_EQ(socket.connect("127.0.0.1", 34572, slice), std::nullopt);
+    service.reset();
+    std::optional<int> rc;
+    while (!rc) {
+        rc = socket.waitConnected(slice);
+    }
+    EXPECT_EQ(rc, -1);
 }
 
 TEST(DeferCancellation, HoldsACancelBackWhileItLives) {

@@ -14,12 +14,11 @@ namespace {
 
 using nlohmann::json;
 using raid::test::answering;
+using raid::test::BusyService;
 using raid::test::Connection;
 using raid::test::End;
 using raid::test::newestEventDocument;
 using raid::test::ScriptedService;
-using raid::test::Socket;
-using raid::test::throwIfNegative;
 using testing::AllOf;
 using testing::ContainsRegex;
 using testing::HasSubstr;

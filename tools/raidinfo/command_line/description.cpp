@@ -77,7 +77,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
     {"list", "Show the lists of the inventory as tables",
      "Examples:\n"
      "  raidinfo list\n"
-     "  raidinfo list disk_drives --filter 'state!=1' -o +firmware_level\n"
+     "  raidinfo list disk_drives --filter 'state!=online' -o +firmware_level\n"
      "  raidinfo list logical_drives -o logical_drive_id,overall_status --noheadings\n"
      "  raidinfo list --json | jq '.data.disk_drives[].serial_number'",
      [](CLI::App& app, Words& words) {
@@ -88,9 +88,9 @@ constexpr auto subcommands = std::to_array<Subcommand>({
              ->type_name(value_type::columns)
              ->take_last();
          app.add_option("--filter", words.filters,
-                        "Only records with this, such as state!=0; operators = != < <= > >= and "
-                        "~ (contains); may be repeated")
-             ->type_name("KEY=VALUE")
+                        "Only records with this, such as state!=online or size>1000; the operators "
+                        "are = != < <= > >= and ~ (contains); may be repeated")
+             ->type_name("FILTER")
              ->expected(1)
              ->take_all();
          app.add_flag("--noheadings", words.noHeadings, "Print no titles");

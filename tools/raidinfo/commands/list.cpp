@@ -12,20 +12,32 @@
 namespace raidinfo {
 namespace {
 
-/// The kinds to list: the one asked for, or all that have the columns that filters look at.
-std::vector<const Kind*> kindsOf(const ListOptions& list) {
+bool haveColumns(const Kind& kind, const std::vector<Filter>& filters) {
+    return std::ranges::all_of(filters,
+                               [&kind](const Filter& filter) { return concerns(filter, kind); });
+}
+
+/// The kinds to list: the one asked for, or all of which the filters can hold. In "state=rebuilding"
+/// that is every kind with such a state.
+std::vector<const Kind*> kindsOf(const ListOptions& list, const CodeBook& book) {
     if (list.kind != nullptr) {
+        checkFilters(list.filters, *list.kind, book);
         return {list.kind};
     }
     std::vector<const Kind*> kinds;
+    Failure trouble{ExitStatus::usage, "no list has all the columns of the filters"};
     for (const Kind& kind : inventoryKinds()) {
-        if (std::ranges::all_of(list.filters,
-                                [&kind](const Filter& filter) { return concerns(filter, kind); })) {
-            kinds.push_back(&kind);
+        if (haveColumns(kind, list.filters)) {
+            try {
+                checkFilters(list.filters, kind, book);
+                kinds.push_back(&kind);
+            } catch (const Failure& failure) {
+                trouble = failure;
+            }
         }
     }
     if (kinds.empty()) {
-        throw Failure{ExitStatus::usage, "no list has all the columns of the filters"};
+        throw trouble;
     }
     return kinds;
 }
@@ -40,21 +52,21 @@ ColumnChoice columnsOf(const ListOptions& list, bool json) {
     return {.all = everything, .chief = !everything};
 }
 
-Listing chosen(const Kind& kind, const Trees& trees, const ListOptions& list, bool json) {
-    const auto columns = chosenColumns(columnsOf(list, json), kind);
-    return withColumns(filtered(listingOf(kind, trees.snapshot(), trees.adapters()), list.filters),
-                       columns);
+Listing chosen(const Kind& kind, const Trees& trees, const ListOptions& list,
+               const Session& session) {
+    const auto columns = chosenColumns(columnsOf(list, session.options().json), kind);
+    const Listing whole = listingOf(kind, trees.snapshot(), trees.adapters());
+    return withColumns(filtered(whole, list.filters, session.codeBook()), columns);
 }
 
 }  // namespace
 
 int runCommand(const Session& session, const ListOptions& list) {
-    const std::vector<const Kind*> kinds = kindsOf(list);
+    const std::vector<const Kind*> kinds = kindsOf(list, session.codeBook());
     const bool json = session.options().json;
     for (const Kind* const kind : kinds) {
         // What is wrong with the command line is said before anybody is asked.
         static_cast<void>(chosenColumns(columnsOf(list, json), *kind));
-        checkFilters(list.filters, *kind);
     }
     const Trees trees = session.inventory();
     auto lists = Json::object();
@@ -62,7 +74,7 @@ int runCommand(const Session& session, const ListOptions& list) {
     layout.headings = list.headings;
     std::string text;
     for (const Kind* const kind : kinds) {
-        const Listing listing = chosen(*kind, trees, list, json);
+        const Listing listing = chosen(*kind, trees, list, session);
         if (json) {
             lists[std::string{kind->key}] = rowsJson(listing);
         } else if (list.kind != nullptr) {

@@ -183,9 +183,9 @@ constexpr auto fanFields = std::to_array<Field>({
     {"getRAIDFanChannelIDString", "channel_name", "Channel name", displayName},
     {"getRAIDFanAdapterIDString", "adapter_name", "Adapter name", displayName},
     {"getRAIDFanStatus", "status", "Status", number, summary},
-    {"getRAIDFanEnclosureID", "enclosure_id", "Enclosure ID", number, chief},
-    {"getRAIDFanChannelID", "channel_id", "Channel ID", number, chief},
-    {"getRAIDFanAdapterID", "adapter_id", "Adapter ID", number, chief},
+    {"getRAIDFanEnclosureID", "enclosure_id", "Enclosure ID", number},
+    {"getRAIDFanChannelID", "channel_id", "Channel ID", number},
+    {"getRAIDFanAdapterID", "adapter_id", "Adapter ID", number},
 });
 
 constexpr auto powerSupplyFields = std::to_array<Field>({
@@ -195,9 +195,9 @@ constexpr auto powerSupplyFields = std::to_array<Field>({
     {"getRAIDPowerSupplyChannelIDString", "channel_name", "Channel name", displayName},
     {"getRAIDPowerSupplyAdapterIDString", "adapter_name", "Adapter name", displayName},
     {"getRAIDPowerSupplyStatus", "status", "Status", number, summary},
-    {"getRAIDPowerSupplyEnclosureID", "enclosure_id", "Enclosure ID", number, chief},
-    {"getRAIDPowerSupplyChannelID", "channel_id", "Channel ID", number, chief},
-    {"getRAIDPowerSupplyAdapterID", "adapter_id", "Adapter ID", number, chief},
+    {"getRAIDPowerSupplyEnclosureID", "enclosure_id", "Enclosure ID", number},
+    {"getRAIDPowerSupplyChannelID", "channel_id", "Channel ID", number},
+    {"getRAIDPowerSupplyAdapterID", "adapter_id", "Adapter ID", number},
 });
 
 constexpr auto temperatureSensorFields = std::to_array<Field>({
@@ -206,9 +206,9 @@ constexpr auto temperatureSensorFields = std::to_array<Field>({
     {"getRAIDTempSensorChannelIDString", "channel_name", "Channel name", displayName},
     {"getRAIDTempSensorAdapterIDString", "adapter_name", "Adapter name", displayName},
     {"getRAIDTempSensorStatus", "status", "Status", number, summary},
-    {"getRAIDTempSensorEnclosureID", "enclosure_id", "Enclosure ID", number, chief},
-    {"getRAIDTempSensorChannelID", "channel_id", "Channel ID", number, chief},
-    {"getRAIDTempSensorAdapterID", "adapter_id", "Adapter ID", number, chief},
+    {"getRAIDTempSensorEnclosureID", "enclosure_id", "Enclosure ID", number},
+    {"getRAIDTempSensorChannelID", "channel_id", "Channel ID", number},
+    {"getRAIDTempSensorAdapterID", "adapter_id", "Adapter ID", number},
 });
 
 constexpr auto eventFields = std::to_array<Field>({
@@ -235,8 +235,13 @@ constexpr auto diskDriveTreeFields = std::to_array<TreeField>({
     {"hot_spare", "Hot spare", flag, chief},
 });
 
+// The library publishes the parts of an enclosure without what they belong to: their fields for
+// that are 0.
 constexpr auto enclosurePartTreeFields = std::to_array<TreeField>({
     {"index", "Index", number, chief},
+    {"enclosure", "Enclosure", number, chief, Holder::enclosure},
+    {"channel", "Channel", number, chief, Holder::channel},
+    {"adapter", "Adapter", number, chief, Holder::adapter},
 });
 
 constexpr auto allKinds = std::to_array<Kind>({

@@ -3,6 +3,7 @@
 #include <array>
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <span>
 #include <string_view>
 
@@ -32,12 +33,17 @@ struct Field {
     Summary summary = Summary::no;
 };
 
-/// What only the library's model tells of a record; the tree has it among its extras.
+/// Whose number a field of the tree is.
+enum class Holder : std::uint8_t { adapter, channel, enclosure };
+
+/// What only the library's model tells of a record: the tree has it among the record's extras, or
+/// it is the number of what the record belongs to.
 struct TreeField {
     std::string_view key;
     std::string_view title;
     Shape shape;
     Summary summary = Summary::no;
+    std::optional<Holder> holder = std::nullopt;
 };
 
 enum class KindId : std::uint8_t {

@@ -49,6 +49,7 @@ public:
                           "the library's lists do not match its configuration model"};
         }
         return {.title = numbered(id, number),
+                .number = number,
                 .kind = &kindOf(id),
                 .record = &records[position],
                 .position = position};
@@ -88,6 +89,7 @@ private:
         const auto family = std::ranges::find(families, type, &Family::adapterType);
         if (family == families.end()) {
             return {.title = "Adapter " + std::to_string(id),
+                    .number = id,
                     .extras = {{"family", UnknownStatus{}},
                                {"adapter_type", decoded(type)},
                                {"adapter_id", id}},
@@ -204,6 +206,7 @@ private:
             return publication.next(id, number);
         }
         return {.title = numbered(id, number),
+                .number = number,
                 .extras = {{"array_id", number}},
                 .remark = "not published"};
     }

@@ -26,6 +26,7 @@ using Extras = std::vector<std::pair<std::string_view, Value>>;
 /// One line of the tree.
 struct Node {
     std::string title;  ///< "Channel 1", "Disk drive 3"
+    int number = 0;     ///< of the title
     Extras extras = {};
     std::string remark = {};         ///< the extras worth telling people
     const Kind* kind = nullptr;      ///< of the record

@@ -13,14 +13,6 @@ void take(std::vector<std::size_t>& chosen, std::size_t column) {
     }
 }
 
-std::string known(const std::vector<ListColumn>& columns) {
-    std::string list;
-    for (const ListColumn& column : columns) {
-        list += (list.empty() ? "" : ", ") + std::string{column.key};
-    }
-    return list;
-}
-
 }  // namespace
 
 ColumnChoice parseColumns(std::string_view text) {
@@ -53,8 +45,7 @@ std::vector<std::size_t> chosenColumns(const ColumnChoice& choice, const Kind& k
     for (const std::string& key : choice.keys) {
         const auto found = std::ranges::find(columns, key, &ListColumn::key);
         if (found == columns.end()) {
-            throw Failure{ExitStatus::usage, std::string{kind.key} + " has no column \"" + key +
-                                                 "\"; it has " + known(columns)};
+            throw Failure{ExitStatus::usage, withoutColumn(kind, key)};
         }
         take(chosen, static_cast<std::size_t>(found - columns.begin()));
     }

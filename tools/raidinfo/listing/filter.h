@@ -5,6 +5,7 @@
 #include <string_view>
 #include <vector>
 
+#include "codebook/code_book.h"
 #include "listing/listing.h"
 
 namespace raidinfo {
@@ -32,12 +33,13 @@ struct Filter {
 [[nodiscard]] bool concerns(const Filter& filter, const Kind& kind) noexcept;
 
 /// What no record of the kind could be compared with is a usage Failure, as is a column that the
-/// kind does not have. The values of what only the tree knows are for `filtered` to look at.
-void checkFilters(const std::vector<Filter>& filters, const Kind& kind);
+/// kind does not have.
+void checkFilters(const std::vector<Filter>& filters, const Kind& kind, const CodeBook& book);
 
-/// The rows that fulfil all filters. Numbers compare as numbers, flags with yes, no, true, false, 1
-/// and 0, texts byte by byte, an unknown status as "unknown", lists of numbers number by number for
-/// "~" and as they are shown otherwise. Fails as checkFilters does.
-[[nodiscard]] Listing filtered(Listing listing, const std::vector<Filter>& filters);
+/// The rows that fulfil all filters. Numbers compare as numbers, codes by their names, too, flags
+/// with yes, no, true, false, 1 and 0, texts byte by byte, what is not known as "unknown", lists of
+/// numbers number by number for "~" and as they are shown otherwise. Fails as checkFilters does.
+[[nodiscard]] Listing filtered(Listing listing, const std::vector<Filter>& filters,
+                               const CodeBook& book);
 
 }  // namespace raidinfo

@@ -7,28 +7,38 @@
 namespace raidinfo {
 namespace {
 
-/// The extras of the kind's records by position.
-using ExtrasByPosition = std::map<std::size_t, const Extras*>;
+/// A record in the tree: its node, and what that belongs to, from the adapter down.
+struct Place {
+    const Node* node;
+    std::vector<const Node*> holders;
+};
 
-void gather(const Kind& kind, const Group& group, ExtrasByPosition& found) {
+/// The records of a kind by position.
+using Places = std::map<std::size_t, Place>;
+
+void gather(const Kind& kind, const Group& group, std::vector<const Node*>& holders,
+            Places& found) {
     for (const Node& node : group.nodes) {
         if (node.kind == &kind && node.inFull && node.position) {
-            found.emplace(*node.position, &node.extras);
+            found.emplace(*node.position, Place{&node, holders});
         }
+        holders.push_back(&node);
         for (const Group& below : node.groups) {
-            gather(kind, below, found);
+            gather(kind, below, holders, found);
         }
+        holders.pop_back();
     }
 }
 
-Value extraOf(const Extras* extras, std::string_view key) {
-    if (extras != nullptr) {
-        const auto found = std::ranges::find(*extras, key, &Extras::value_type::first);
-        if (found != extras->end()) {
-            return found->second;
-        }
+Value valueOf(const Place& place, const TreeField& field) {
+    if (field.holder) {
+        // Enclosures stand below channels, and those below adapters.
+        const auto depth = static_cast<std::size_t>(*field.holder);
+        return depth < place.holders.size() ? Value{place.holders[depth]->number} : UnknownStatus{};
     }
-    return UnknownStatus{};
+    const auto& extras = place.node->extras;
+    const auto found = std::ranges::find(extras, field.key, &Extras::value_type::first);
+    return found == extras.end() ? UnknownStatus{} : found->second;
 }
 
 }  // namespace
@@ -46,10 +56,19 @@ std::vector<ListColumn> columnsOf(const Kind& kind) {
     return columns;
 }
 
+std::string withoutColumn(const Kind& kind, std::string_view key) {
+    std::string list;
+    for (const ListColumn& column : columnsOf(kind)) {
+        list += (list.empty() ? "" : ", ") + std::string{column.key};
+    }
+    return std::string{kind.key} + " has no column \"" + std::string{key} + "\"; it has " + list;
+}
+
 Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees) {
-    ExtrasByPosition extras;
+    Places places;
     if (!kind.fromTree.empty()) {
-        gather(kind, trees, extras);
+        std::vector<const Node*> holders;
+        gather(kind, trees, holders, places);
     }
     Listing listing{&kind, columnsOf(kind), {}};
     const Records& records = snapshot.of(kind.id);
@@ -58,9 +77,9 @@ Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees
         std::vector<Value>& row = listing.rows.emplace_back();
         row.reserve(listing.columns.size());
         row.emplace_back(static_cast<int>(position));
-        const auto found = extras.find(position);
+        const auto place = places.find(position);
         for (const TreeField& field : kind.fromTree) {
-            row.push_back(extraOf(found == extras.end() ? nullptr : found->second, field.key));
+            row.push_back(place == places.end() ? UnknownStatus{} : valueOf(place->second, field));
         }
         row.insert(row.end(), records[position].begin(), records[position].end());
     }

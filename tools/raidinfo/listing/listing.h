@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -29,6 +30,9 @@ struct Listing {
 
 /// All columns of a kind.
 [[nodiscard]] std::vector<ListColumn> columnsOf(const Kind& kind);
+
+/// Says that a kind has no such column, and which it has.
+[[nodiscard]] std::string withoutColumn(const Kind& kind, std::string_view key);
 
 /// The records of the kind in the order of their positions; the trees are those of the snapshot.
 [[nodiscard]] Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees);

@@ -17,6 +17,7 @@ using testing::HasSubstr;
 
 const Kind& drives = kindOf(KindId::diskDrive);
 const Kind& fans = kindOf(KindId::fan);
+const CodeBook book = shippedCodeBook();
 
 // Three drives, of which the tree knows the first two.
 class DriveListing : public testing::Test {
@@ -60,7 +61,7 @@ protected:
         for (const char* const condition : conditions) {
             filters.push_back(parseFilter(condition));
         }
-        return column(filtered(listing, filters), "position");
+        return column(filtered(listing, filters, book), "position");
     }
 
     Snapshot snapshot;
@@ -97,6 +98,26 @@ TEST_F(DriveListing, IsFilteredByTextsFlagsAndStatus) {
     EXPECT_THAT(positionsWhere({"overall_status=unknown"}), ElementsAre(Value{2}));
 }
 
+TEST_F(DriveListing, IsFilteredByTheNamesOfCodes) {
+    EXPECT_THAT(positionsWhere({"state=online"}), ElementsAre(Value{0}));
+    EXPECT_THAT(positionsWhere({"state!=online"}), ElementsAre(Value{1}, Value{2}));
+    EXPECT_THAT(positionsWhere({"state~fail"}), ElementsAre(Value{1}));
+    EXPECT_THAT(positionsWhere({"state=unknown"}), ElementsAre(Value{2}))
+        << "a code without a name";
+}
+
+TEST_F(DriveListing, SaysWhichNamesTheCodesHave) {
+    for (const char* const wrong : {"state=onlin", "state<online"}) {
+        try {
+            static_cast<void>(positionsWhere({wrong}));
+            ADD_FAILURE() << wrong;
+        } catch (const Failure& failure) {
+            EXPECT_THAT(failure.what(), HasSubstr("online"));
+            EXPECT_THAT(failure.what(), HasSubstr("unknown"));
+        }
+    }
+}
+
 TEST_F(DriveListing, IsFilteredByAllConditionsTogether) {
     EXPECT_THAT(positionsWhere({"state>1", "vendor!=BRASK"}), ElementsAre(Value{2}));
 }
@@ -127,6 +148,25 @@ TEST_F(DriveListing, ShowsTheColumnsThatAreChosenInTheirOrder) {
     EXPECT_THAT(chosen.rows[1], ElementsAre(Value{4}, Value{1}));
 }
 
+// The library publishes fans without what they belong to.
+TEST(FanListing, TellsWhatTheFanBelongsTo) {
+    Snapshot snapshot;
+    snapshot.of(KindId::fan) = {sample(fans, {})};
+    const Node fan{.title = "Fan 3",
+                   .number = 3,
+                   .extras = {{"index", 3}},
+                   .kind = &fans,
+                   .record = &snapshot.of(KindId::fan).front(),
+                   .position = 0};
+    const Node enclosure{.title = "Enclosure 6", .number = 6, .groups = {{"fans", {fan}}}};
+    const Node channel{.title = "Channel 2", .number = 2, .groups = {{"enclosures", {enclosure}}}};
+    const Node adapter{.title = "Adapter 1", .number = 1, .groups = {{"channels", {channel}}}};
+    const Listing listing = listingOf(fans, snapshot, {"adapters", {adapter}});
+    ASSERT_EQ(listing.rows.size(), 1U);
+    const std::vector<Value> place(listing.rows.front().begin(), listing.rows.front().begin() + 5);
+    EXPECT_THAT(place, ElementsAre(Value{0}, Value{3}, Value{6}, Value{2}, Value{1}));
+}
+
 TEST(Filter, IsReadFromItsText) {
     const Filter filter = parseFilter("overall_status!=a=b");
     EXPECT_EQ(filter.key, "overall_status");
@@ -138,9 +178,9 @@ TEST(Filter, IsReadFromItsText) {
 }
 
 TEST(Filter, IsCheckedWithoutAnyRecord) {
-    EXPECT_NO_THROW(checkFilters({parseFilter("overall_status=unknown")}, drives));
+    EXPECT_NO_THROW(checkFilters({parseFilter("overall_status=unknown")}, drives, book));
     for (const char* const wrong : {"nokey=1", "state=many", "overall_status=Bogus"}) {
-        EXPECT_THROW(checkFilters({parseFilter(wrong)}, drives), Failure) << wrong;
+        EXPECT_THROW(checkFilters({parseFilter(wrong)}, drives, book), Failure) << wrong;
     }
 }
 
@@ -151,11 +191,21 @@ TEST(Filter, ConcernsTheKindsThatHaveItsColumn) {
     EXPECT_TRUE(concerns(parseFilter("position=1"), fans));
 }
 
+std::vector<std::string_view> keysOf(const std::vector<std::size_t>& columns, const Kind& kind) {
+    std::vector<std::string_view> keys;
+    for (const std::size_t column : columns) {
+        keys.push_back(columnsOf(kind)[column].key);
+    }
+    return keys;
+}
+
 TEST(Columns, AreTheChiefOnesAndMore) {
     const auto chief = chosenColumns({.chief = true}, fans);
-    EXPECT_THAT(chief, ElementsAre(0U, 1U, 6U, 7U, 8U, 9U));
-    EXPECT_THAT(chosenColumns(parseColumns("+fan_name,status"), fans),
-                ElementsAre(0U, 1U, 6U, 7U, 8U, 9U, 2U));
+    EXPECT_THAT(keysOf(chief, fans),
+                ElementsAre("position", "index", "enclosure", "channel", "adapter", "status"));
+    EXPECT_THAT(
+        keysOf(chosenColumns(parseColumns("+fan_name,status"), fans), fans),
+        ElementsAre("position", "index", "enclosure", "channel", "adapter", "status", "fan_name"));
     EXPECT_EQ(chosenColumns(parseColumns("all"), fans).size(), columnsOf(fans).size());
 }
 
@@ -166,7 +216,7 @@ TEST(Columns, ThatAKindDoesNotHaveAreRefusedWithThoseItHas) {
     } catch (const Failure& failure) {
         EXPECT_EQ(failure.status(), ExitStatus::usage);
         EXPECT_THAT(failure.what(), HasSubstr("\"speed\""));
-        EXPECT_THAT(failure.what(), HasSubstr("position, index, fan_name"));
+        EXPECT_THAT(failure.what(), HasSubstr("position, index, enclosure"));
     }
     for (const char* const wrong : {"", "+", "a,,b", "a,"}) {
         EXPECT_THROW(static_cast<void>(parseColumns(wrong)), Failure) << wrong;

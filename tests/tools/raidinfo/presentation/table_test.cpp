@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include "listing/column_choice.h"
 #include "sample.h"
 
 namespace raidinfo {
@@ -15,18 +16,6 @@ Listing listingOfFans(const Records& records) {
     Snapshot snapshot;
     snapshot.of(KindId::fan) = records;
     return listingOf(fans, snapshot, {"adapters", {}});
-}
-
-TEST(ShownValue, IsShortAndPlain) {
-    EXPECT_EQ(shown(-7), "-7");
-    EXPECT_EQ(shown(true), "yes");
-    EXPECT_EQ(shown(false), "no");
-    EXPECT_EQ(shown(std::string{"A&B"}), "A&B");
-    EXPECT_EQ(shown(std::string{}), "-");
-    EXPECT_EQ(shown(std::string{"a\nb"}), "a\\u{a}b");
-    EXPECT_EQ(shown(UnknownStatus{}), "unknown");
-    EXPECT_EQ(shown(std::vector<int>{7, -1, 7}), "7,-1,7");
-    EXPECT_EQ(shown(std::vector<int>{}), "-");
 }
 
 TEST(StatusWord, HasTheLookOfItsMeaning) {
@@ -46,7 +35,7 @@ TEST(Table, AlignsNumbersToTheRightAndTextsToTheLeft) {
         listingOfFans(
             {sample(fans, {{"fan_name", "Disk Drive 0"}, {"status_name", "é"}, {"status", 5}}),
              sample(fans, {{"fan_name", "日本"}, {"status", -1234567}})}),
-        {0, 2, 3, 6});
+        chosenColumns(parseColumns("position,fan_name,status_name,status"), fans));
     EXPECT_EQ(titledTable(listing, {}, CodeBook{}),
               "Fans: 2\n"
               "  #  Fan name      Status name    Status\n"
@@ -57,8 +46,9 @@ TEST(Table, AlignsNumbersToTheRightAndTextsToTheLeft) {
 TEST(Table, HasTheMeaningOfACodeBesideIt) {
     CodeBook book;
     book.define("fans", "status", CodeBook::Codes{{5, "slow"}});
-    const Listing listing = withColumns(
-        listingOfFans({sample(fans, {{"status", 5}}), sample(fans, {{"status", 123}})}), {0, 6});
+    const Listing listing =
+        withColumns(listingOfFans({sample(fans, {{"status", 5}}), sample(fans, {{"status", 123}})}),
+                    chosenColumns(parseColumns("position,status"), fans));
     EXPECT_EQ(table(listing, {}, book),
               "  #  Status\n"
               "  0  5 (slow)\n"
