@@ -10,8 +10,8 @@ from pathlib import Path
 
 import pytest
 from page import PAGES, SOURCES, page
-from programs import EXAMPLES, RAIDINFO, recording
-from stage import POLL, control, play, run, simulator, tell
+from programs import EXAMPLES, PROGRAMS, RAIDINFO, recording
+from stage import POLL, control, play, play_dialogue, run, simulator, tell
 
 SERVICE = "raidsim --init small-server.init small-server.xml"
 
@@ -26,8 +26,11 @@ def folder(tmp_path: Path, monkeypatch: pytest.MonkeyPatch) -> Path:
 
 
 def play_beside_a_service(block: str) -> None:
-    with simulator(SERVICE):
-        play(block)
+    with simulator(SERVICE) as service:
+        if block.startswith("$ "):
+            play_dialogue(block, service)
+        else:
+            play(block)
 
 
 def play_commands_or_lines_of_control(block: str) -> None:
@@ -90,6 +93,7 @@ def look_around(block: str) -> None:
 
 EXAMPLES_OF: dict[str, Callable[[str], None]] = {
     "raidinfo(1)": play_beside_a_service,
+    **{f"raidinfo-{name}(1)": play_beside_a_service for name in PROGRAMS[0].subcommands()},
     "raidsim(1)": play_commands_or_lines_of_control,
     "libRAIDInstrumentation(3)": run_a_program,
     "raid-fault(5)": arm_a_fault,
@@ -97,6 +101,8 @@ EXAMPLES_OF: dict[str, Callable[[str], None]] = {
     "raid-scenario(5)": play_a_scenario,
     "raidinfo-codes(5)": show_codes,
     "raidinfo-policy(5)": judge_by_a_policy,
+    "raidinfo-snapshot(5)": play_beside_a_service,
+    "raidinfo-state(5)": play_beside_a_service,
     "raid-instrumentation(7)": look_around,
 }
 

@@ -26,14 +26,14 @@ class Page:
     def __str__(self) -> str:
         return f"{self.name}({self.section})"
 
-    def subsection(self, section: str, title: str) -> str:
-        headings = re.split(r"(?m)^## (.+)\n", self.sections[section])
-        return dict(zip(headings[1::2], headings[2::2])).get(title, "")
+    def summary(self) -> str:
+        """What NAME says of it in a few words."""
+        line: str = self.sections["NAME"].strip()
+        return line.removeprefix(f"{self.name} - ")
 
     def references(self, section: str) -> list[str]:
         """The pages that a section refers to, such as "raidinfo(1)"."""
-        found = re.findall(r"\*([\w-]+)\*\((\d)\)", self.sections[section])
-        return [f"{name}({number})" for name, number in found]
+        return referred(self.sections[section])
 
     def blocks(self, section: str) -> list[str]:
         """The literal blocks of a section."""
@@ -46,9 +46,18 @@ class Page:
         return [without_markup(line.removesuffix("++")) for line in text.splitlines() if line]
 
 
+def referred(text: str) -> list[str]:
+    return [f"{name}({number})" for name, number in re.findall(r"\*([\w-]+)\*\((\d)\)", text)]
+
+
 def terms(text: str) -> list[str]:
     """What a text defines: lines with an indented explanation below."""
     return re.findall(r"(?m)^(\S.*)\n\t", text)
+
+
+def rows(text: str) -> dict[str, str]:
+    """What the first column of a table holds, as it is written, and what stands beside it."""
+    return dict(re.findall(r"(?m)^\|[\[ ] (.+)\n:[< ] +(.+(?:\n +.+)*)$", text))
 
 
 PAGES = [Page(path) for path in sorted((SOURCES / "man").glob("*.scd"))]

@@ -57,10 +57,10 @@ def known_words(message: str) -> set[str]:
     return set(re.split(", ", message.rstrip().rpartition("known: ")[2]))
 
 
-def recording(folder: Path) -> Path:
-    """A recording of the small server."""
-    answer = (EXAMPLES / "small-server.xml").read_text(encoding="utf-8")
-    path = folder / "small-server.rec"
+def recording(folder: Path, document: str = "small-server.xml") -> Path:
+    """A recording of one of the examples."""
+    answer = (EXAMPLES / document).read_text(encoding="utf-8")
+    path = folder / Path(document).with_suffix(".rec")
     size = len(answer.encode())
     heading = f"raid-recording 1 2026-11-21T17:48:00Z\nanswer 0 configuration {size}\n"
     path.write_text(heading + answer + "\n", encoding="utf-8")

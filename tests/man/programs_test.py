@@ -1,17 +1,28 @@
 """The pages say of the programs what the programs say of themselves."""
 
+import json
 import re
 import subprocess
 import tomllib
 from pathlib import Path
 
 import pytest
-from page import PAGES, SOURCES, Page, page, terms, without_markup
+from page import PAGES, SOURCES, Page, page, rows, terms, without_markup
 from programs import EXAMPLES, PROGRAMS, RAIDINFO, RAIDSIM, Program, known_words, recording
 
 HELP = "-h, --help"
 
+RAIDINFO_SUBCOMMANDS = PROGRAMS[0].subcommands()
+SUBCOMMANDS = [(program, name) for program in PROGRAMS for name in program.subcommands()]
+
 every_program = pytest.mark.parametrize("program", PROGRAMS, ids=str)
+every_subcommand = pytest.mark.parametrize(("program", "subcommand"), SUBCOMMANDS, ids=str)
+
+
+def page_of(program: Program, subcommand: str = "") -> Page:
+    """A subcommand of raidinfo has a page of its own, that of raidsim has a section."""
+    own = subcommand and program.name == "raidinfo"
+    return page(f"{program.name}-{subcommand}(1)" if own else f"{program.name}(1)")
 
 
 def defined_options(text: str) -> set[str]:
@@ -24,43 +35,74 @@ def names(text: str) -> set[str]:
     return set(re.findall(r"(?<![\w-])--[a-z][a-z-]*", text))
 
 
-@every_program
-def test_every_option_is_defined_and_no_other(program: Program) -> None:
-    assert defined_options(page(program.name + "(1)").sections["OPTIONS"]) == program.options()
+def options_by_place() -> dict[tuple[str, str], set[str]]:
+    """The options that programs have, by the pages and sections where they are looked for."""
+    places = {(f"{program}(1)", "OPTIONS"): program.options() for program in PROGRAMS}
+    for program, subcommand in SUBCOMMANDS:
+        section = {"generate": "GENERATING DOCUMENTS"}.get(subcommand, "OPTIONS")
+        own = program.options(subcommand) - {HELP}
+        places[str(page_of(program, subcommand)), section] = own
+    return {place: options for place, options in places.items() if options}
 
 
-def test_every_subcommand_of_raidinfo_is_defined_and_no_other() -> None:
-    shown = re.findall(r"(?m)^## (\w+)$", page("raidinfo(1)").sections["SUBCOMMANDS"])
-    assert shown == PROGRAMS[0].subcommands()
+def test_every_option_is_defined_in_its_place_and_nowhere_else() -> None:
+    defined = {
+        (str(each), section): defined_options(text)
+        for each in PAGES
+        for section, text in each.sections.items()
+    }
+    assert {place: found for place, found in defined.items() if found} == options_by_place()
 
 
-@pytest.mark.parametrize("subcommand", PROGRAMS[0].subcommands())
-def test_every_option_of_a_subcommand_is_defined_and_no_other(subcommand: str) -> None:
-    text = page("raidinfo(1)").subsection("SUBCOMMANDS", subcommand)
-    assert defined_options(text) == PROGRAMS[0].options(subcommand) - {HELP}
+def test_every_subcommand_of_raidinfo_has_its_page_and_every_page_its_subcommand() -> None:
+    of_subcommands = {
+        each.name for each in PAGES if each.name.startswith("raidinfo-") and each.section == "1"
+    }
+    assert of_subcommands == {f"raidinfo-{name}" for name in RAIDINFO_SUBCOMMANDS}
 
 
-def test_every_option_of_generate_is_defined_and_no_other() -> None:
-    assert PROGRAMS[1].subcommands() == ["generate"]
-    text = page("raidsim(1)").sections["GENERATING DOCUMENTS"]
-    assert defined_options(text) == PROGRAMS[1].options("generate") - {HELP}
+def test_raidinfo_lists_its_subcommands_as_the_help_does_and_by_what_their_pages_say() -> None:
+    shown = rows(page("raidinfo(1)").sections["SUBCOMMANDS"])
+    assert list(shown) == [f"*raidinfo-{name}*(1)" for name in RAIDINFO_SUBCOMMANDS]
+    for name, line in zip(RAIDINFO_SUBCOMMANDS, shown.values()):
+        summary = page(f"raidinfo-{name}(1)").summary()
+        assert without_markup(line) == f"{summary[0].upper()}{summary[1:]}."
+
+
+@pytest.mark.parametrize("subcommand", RAIDINFO_SUBCOMMANDS)
+def test_the_page_of_a_subcommand_has_what_is_looked_for(subcommand: str) -> None:
+    sections = page(f"raidinfo-{subcommand}(1)").sections
+    assert {"SYNOPSIS", "OPTIONS", "EXIT STATUS"} <= set(sections)
+    for section in ("OPTIONS", "EXIT STATUS"):
+        assert "*raidinfo*(1)" in sections[section]
+
+
+@pytest.mark.parametrize("subcommand", RAIDINFO_SUBCOMMANDS)
+def test_the_exit_statuses_of_a_subcommand_are_among_those_of_raidinfo(subcommand: str) -> None:
+    shown = terms(page(f"raidinfo-{subcommand}(1)").sections["EXIT STATUS"])
+    assert set(re.findall(r"\d+", " ".join(shown))) <= set(PROGRAMS[0].statuses())
+
+
+@pytest.mark.parametrize("subcommand", RAIDINFO_SUBCOMMANDS)
+def test_every_member_of_what_a_subcommand_prints_as_json_is_there(subcommand: str) -> None:
+    schema = subprocess.run([RAIDINFO, "schema"], capture_output=True, check=True).stdout
+    definitions = json.loads(schema)["$defs"]
+    printed = definitions.get({"events": "event"}.get(subcommand, subcommand), {})
+    text = page(f"raidinfo-{subcommand}(1)").sections["DESCRIPTION"]
+    assert [key for key in printed.get("properties", {}) if f"*{key}*" not in text] == []
 
 
 def form_of(program: Program, subcommand: str) -> str:
     found = [
         form
-        for form in page(program.name + "(1)").forms()
+        for form in page_of(program, subcommand).forms()
         if re.match(rf"{program.name} (\[OPTION\]... )?{subcommand}\b", form)
     ]
     assert len(found) == 1
     return found[0]
 
 
-@pytest.mark.parametrize(
-    ("program", "subcommand"),
-    [(program, name) for program in PROGRAMS for name in program.subcommands()],
-    ids=str,
-)
+@every_subcommand
 def test_the_synopsis_is_that_of_the_program(program: Program, subcommand: str) -> None:
     form = form_of(program, subcommand)
     help_text = program.help(subcommand)
@@ -176,12 +218,28 @@ def test_every_word_that_a_policy_or_a_code_book_knows_is_there(
     assert {word for word in known if not re.search(rf"[*\"]{word}[*\"]", text)} == set()
 
 
-def test_every_kind_of_record_is_there() -> None:
+def chief_columns(kind: str, recorded: Path) -> list[str]:
+    """What the program adds to, of which JSON tells the keys, without the position."""
+    command = [RAIDINFO, "--from", str(recorded), "--json", "list", kind, "-o", "+position"]
+    listed = json.loads(subprocess.run(command, capture_output=True, check=True).stdout)
+    return [key for key in listed["data"][kind][0] if key != "position"]
+
+
+def test_every_kind_of_record_is_there_with_its_chief_columns(tmp_path: Path) -> None:
     refused = subprocess.run([RAIDINFO, "list", "other"], capture_output=True, text=True)
-    kinds = re.findall(r"\w+_\w+|\w+", refused.stderr.rpartition("there are ")[2])
-    text = page("raidinfo(1)").subsection("SUBCOMMANDS", "list")
+    kinds = re.findall(r"\w+", refused.stderr.rpartition("there are ")[2])
+    recorded = recording(tmp_path, "mixed.xml")
+    shown = {
+        kind: re.findall(r"\w+", columns)
+        for names_of_kinds, columns in re.findall(
+            r"(?m)^(\*\w+\*(?:, \*\w+\*)*)\n((?:\t.+\n)+)",
+            page("raidinfo-list(1)").sections["DESCRIPTION"],
+        )
+        for kind in re.findall(r"\w+", names_of_kinds)
+    }
+    assert list(shown) == kinds
+    assert shown == {kind: chief_columns(kind, recorded) for kind in kinds}
     assert len(kinds) == 12
-    assert [kind for kind in kinds if f"*{kind}*" not in text] == []
 
 
 def test_the_default_policy_is_that_of_the_program() -> None:

@@ -7,6 +7,7 @@ import subprocess
 import time
 from collections.abc import Iterator
 from contextlib import contextmanager
+from itertools import takewhile
 from pathlib import Path
 from typing import IO
 
@@ -52,6 +53,13 @@ def tell(service: subprocess.Popen[str], line: str) -> None:
     service.stdin.flush()
 
 
+def answer(service: subprocess.Popen[str], line: str) -> str:
+    """What a simulator says to a line, once it has carried it out."""
+    tell(service, line + "\nstatus")
+    lines = iter(lambda: first_line(service.stdout), "")
+    return "".join(takewhile(lambda said: not said.startswith("document "), lines))
+
+
 def control(options: str, lines: str) -> str:
     """What the simulator says to lines that an operator types; all must be to its liking."""
     command = f"exec {RAIDSIM} --port 0 {options}"
@@ -93,14 +101,19 @@ def interrupt(command: str) -> None:
     assert process.returncode == 128 + signal.SIGINT
 
 
-def run(command: str) -> str:
-    done = subprocess.run(
+def shell(command: str, errors: int) -> subprocess.CompletedProcess[str]:
+    return subprocess.run(
         ["/bin/sh", "-c", command],
-        capture_output=True,
+        stdout=subprocess.PIPE,
+        stderr=errors,
         text=True,
         env=environment(),
         timeout=PATIENCE,
     )
+
+
+def run(command: str) -> str:
+    done = shell(command, subprocess.PIPE)
     assert (done.returncode, done.stderr) == (0, "")
     return done.stdout
 
@@ -120,3 +133,15 @@ def play(block: str) -> None:
             interrupt(command)
         else:
             run(command)
+
+
+def play_dialogue(block: str, service: subprocess.Popen[str]) -> None:
+    """Carries out what stands behind the prompts of a block, "$ " for the shell and "raidsim> " for
+    the simulator, and compares what comes out. There "..." stands for the rest of a line or for a
+    part of it, and where it is alone for any lines."""
+    prompts = r"(?m)^(\$|raidsim>) (.+)\n((?:(?!\$ |raidsim> ).*\n)*)"
+    for prompt, line, expected in re.findall(prompts, block):
+        said = answer(service, line) if prompt != "$" else shell(line, subprocess.STDOUT).stdout
+        pattern = re.escape(expected).replace(r"\.\.\.", ".*")
+        pattern = re.sub(r"(?m)^\.\*\\\n", r"(?:.*\n)*", pattern)
+        assert re.fullmatch(pattern, said), f"{line}\n{said}"

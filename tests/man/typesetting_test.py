@@ -75,6 +75,7 @@ def test_it_has_its_name_and_its_sections_where_they_are_looked_for(page: Page) 
 def test_it_refers_to_pages_that_are_there(page: Page) -> None:
     there = {str(each) for each in PAGES}
     of_this_project = re.compile("raid|libRAID")
+    assert set(page.references("SEE ALSO")) <= there
     for section in page.sections:
         assert {name for name in page.references(section) if of_this_project.match(name)} <= there
 
