@@ -6,7 +6,7 @@ import subprocess
 from pathlib import Path
 
 import pytest
-from page import PAGES, Page
+from page import PAGES, Page, referred
 
 BUILT = Path(os.environ["RAID_MAN_PAGES"])
 WIDTH = 80
@@ -84,6 +84,12 @@ def test_it_refers_to_pages_that_are_there(page: Page) -> None:
 def test_it_refers_to_others_in_the_order_of_their_sections(page: Page) -> None:
     others = page.references("SEE ALSO")
     assert others == sorted(set(others) - {str(page)}, key=lambda name: (name[-2], name))
+
+
+@every_page
+def test_whom_it_recommends_refers_to_it(page: Page) -> None:
+    recommended = [each for each in PAGES if str(each) in page.references("SEE ALSO")]
+    assert [str(each) for each in recommended if str(page) not in referred(each.text)] == []
 
 
 def test_the_overview_refers_to_every_page() -> None:
