@@ -42,13 +42,24 @@ std::vector<const Kind*> kindsWritten(std::string_view name) {
     return kinds;
 }
 
-void CodeBook::define(std::string_view kind, std::string_view field, Meaning meaning) {
-    meanings.insert_or_assign(entryKey(kind, field), std::move(meaning));
+void CodeBook::define(std::string_view kind, std::string_view field, Meaning meaning,
+                      std::string origin) {
+    entries.insert_or_assign(entryKey(kind, field), Entry{std::move(meaning), std::move(origin)});
+}
+
+const CodeBook::Entry* CodeBook::entry(std::string_view kind, std::string_view field) const {
+    const auto found = entries.find(entryKey(kind, field));
+    return found == entries.end() ? nullptr : &found->second;
 }
 
 const CodeBook::Meaning* CodeBook::find(std::string_view kind, std::string_view field) const {
-    const auto found = meanings.find(entryKey(kind, field));
-    return found == meanings.end() ? nullptr : &found->second;
+    const Entry* const known = entry(kind, field);
+    return known == nullptr ? nullptr : &known->meaning;
+}
+
+std::string_view CodeBook::origin(std::string_view kind, std::string_view field) const {
+    const Entry* const known = entry(kind, field);
+    return known == nullptr ? std::string_view{} : known->origin;
 }
 
 const CodeBook::Codes* CodeBook::codes(std::string_view kind, std::string_view field) const {

@@ -34,11 +34,15 @@ public:
     /// What the numbers of the field mean; null where nothing is known of them.
     [[nodiscard]] const Meaning* find(std::string_view kind, std::string_view field) const;
 
-    /// Takes the place of what the book said of the field.
-    void define(std::string_view kind, std::string_view field, Meaning meaning);
+    /// Takes the place of what the book said of the field. `origin` tells people where it stands.
+    void define(std::string_view kind, std::string_view field, Meaning meaning,
+                std::string origin = "the code book");
 
     /// None for a field that is no code.
     [[nodiscard]] const Codes* codes(std::string_view kind, std::string_view field) const;
+
+    /// Where what the book says of the field stands; empty where it says nothing.
+    [[nodiscard]] std::string_view origin(std::string_view kind, std::string_view field) const;
 
     /// None for an unknown code, and for every number of a field that is no code.
     [[nodiscard]] std::optional<std::string_view> name(std::string_view kind,
@@ -53,7 +57,13 @@ public:
                                     const Value& value) const;
 
 private:
-    std::map<std::string, Meaning, std::less<>> meanings;  ///< by "kind.field"
+    struct Entry {
+        Meaning meaning;
+        std::string origin;
+    };
+    [[nodiscard]] const Entry* entry(std::string_view kind, std::string_view field) const;
+
+    std::map<std::string, Entry, std::less<>> entries;  ///< by "kind.field"
 };
 
 /// A value as people read it: "4 (failed)", "9 (unknown)", "70006 MB"; without a meaning, and of

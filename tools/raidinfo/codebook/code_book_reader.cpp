@@ -86,7 +86,8 @@ CodeBook amended(CodeBook book, const settings::Table& document) {
             if (std::ranges::find(known, field.key) == known.end()) {
                 refuseUnknown(field.setting.place, "field of " + kind.key, field.key, known);
             }
-            book.define(kind.key, field.key, meaningIn(field));
+            book.define(kind.key, field.key, meaningIn(field),
+                        settings::shown(field.setting.place));
         }
     }
     return book;

@@ -174,9 +174,12 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      "  raidinfo health --explain\n"
      "  raidinfo health --nagios",
      [](CLI::App& app, Words& words) {
-         app.add_flag("--explain", words.explain,
-                      "Name the rule, the record, the field and its value for each finding");
-         app.add_flag("--nagios", words.nagios, "Print the one line of a monitoring plugin");
+         CLI::Option* const explain =
+             app.add_flag("--explain", words.explain,
+                          "Name the rule, the record, the field and its value for each finding");
+         app.add_flag("--nagios", words.nagios, "Print the one line of a monitoring plugin")
+             ->excludes(explain)
+             ->excludes(app.get_parent()->get_option("--json"));
          app.add_option("--policy", words.policy, "Change the rules by this file")
              ->type_name(value_type::file)
              ->check(notEmpty())
@@ -189,7 +192,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      false},
     {"snapshot", "Save the inventory to compare it later", "Example: raidinfo snapshot before.json",
      [](CLI::App& app, Words& words) {
-         app.add_option("file", words.file, "The file to write")
+         app.add_option("file", words.file, "The file to write; - prints it")
              ->type_name(value_type::file)
              ->check(notEmpty())
              ->required();
@@ -223,7 +226,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      "  raidinfo record trouble.rec\n"
      "  raidinfo record --redact --for 3600 for-support.rec",
      [](CLI::App& app, Words& words) {
-         app.add_option("file", words.file, "The file to write")
+         app.add_option("file", words.file, "The file to write; - prints it")
              ->type_name(value_type::file)
              ->check(notEmpty())
              ->required();

@@ -25,19 +25,21 @@ std::vector<const Kind*> kindsOf(const ListOptions& list, const CodeBook& book) 
         return {list.kind};
     }
     std::vector<const Kind*> kinds;
-    Failure trouble{ExitStatus::usage, "no list has all the columns of the filters"};
+    std::string trouble;
     for (const Kind& kind : inventoryKinds()) {
         if (haveColumns(kind, list.filters)) {
             try {
                 checkFilters(list.filters, kind, book);
                 kinds.push_back(&kind);
             } catch (const Failure& failure) {
-                trouble = failure;
+                trouble += (trouble.empty() ? "" : "; ") + std::string{kind.key} + ": " +
+                           failure.what();
             }
         }
     }
     if (kinds.empty()) {
-        throw trouble;
+        throw Failure{ExitStatus::usage,
+                      trouble.empty() ? "no list has all the columns of the filters" : trouble};
     }
     return kinds;
 }

@@ -15,7 +15,8 @@ int runCommand(const Session& session, const RecordOptions& record) {
     if (session.recorded()) {
         throw Failure{ExitStatus::usage, "record saves what the service answers, not a recording"};
     }
-    const std::string heading = recording::heading(presentTimestamp());
+    const std::string startedAt = presentTimestamp();
+    const bool toOutput = isStandardOutput(record.file);
     std::optional<GrowingFile> file;  // from the first answer on: a recording that is there is kept
     std::optional<redact::Redactor> redactor;
     if (record.redact) {
@@ -34,14 +35,21 @@ int runCommand(const Session& session, const RecordOptions& record) {
         if (redactor && kept.body) {
             kept.body = (*redactor)(*kept.body);
         }
+        std::string text = recording::written(kept);
+        if (answers == 1) {
+            text.insert(0, recording::heading(startedAt));
+        }
+        if (toOutput) {
+            session.output().write(text);
+            return;
+        }
         if (!file) {
             file.emplace(record.file);
-            file->append(heading);
         }
-        file->append(recording::written(kept));
+        file->append(text);
     };
     recordAnswers(session.library(), sink, record.duration, session.stop());
-    if (session.options().json) {
+    if (session.options().json && !toOutput) {
         session.print(Json::object({{"file", record.file.string()}, {"answers", answers}}));
     }
     return 0;

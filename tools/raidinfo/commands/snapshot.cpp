@@ -9,6 +9,10 @@ namespace raidinfo {
 int runCommand(const Session& session, const SnapshotOptions& snapshot) {
     Json data = treeJson(session.inventory().adapters());
     const Json saved = enveloped(sourceOf(session.options()), {}, std::move(data));
+    if (isStandardOutput(snapshot.file)) {
+        session.output().write(document(saved));
+        return 0;
+    }
     replaceFile(snapshot.file, document(saved));
     if (session.options().json) {
         session.print(Json::object({{"file", snapshot.file.string()}}));

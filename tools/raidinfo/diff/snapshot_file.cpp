@@ -1,5 +1,6 @@
 #include "diff/snapshot_file.h"
 
+#include <algorithm>
 #include <array>
 #include <string>
 #include <utility>
@@ -65,6 +66,17 @@ void requireComplete(const Json& file) {
     }
 }
 
+/// The logical view repeats drives and leaves out the channels.
+void requirePhysical(const Json& data) {
+    const Json none = Json::array();
+    const bool isLogical = std::ranges::any_of(
+        data.is_object() ? data.value("adapters", none) : none,
+        [](const Json& adapter) { return adapter.is_object() && adapter.contains("hot_spares"); });
+    if (isLogical) {
+        throw SnapshotError{"not a snapshot: it is the logical view of one"};
+    }
+}
+
 }  // namespace
 
 Json snapshotData(std::string_view fileText) {
@@ -77,6 +89,7 @@ Json snapshotData(std::string_view fileText) {
     requireVersion(file["schema_version"]);
     requireComplete(file);
     Json data = std::move(file["data"]);
+    requirePhysical(data);
     [[maybe_unused]] const Entries accepted{data};
     return data;
 }

@@ -65,8 +65,7 @@ private:
         }
         newest = *nextNumber;
         if (!continuity) {
-            continuity = beginning.shownBefore ? Continuity::after(*beginning.shownBefore)
-                                               : Continuity{beginning.first.value_or(newest)};
+            begin();
         }
         if (isAway) {
             isAway = false;
@@ -75,6 +74,20 @@ private:
             listener.notice({"service_available", "the RAID management service answers again"});
         }
         return true;
+    }
+
+    void begin() {
+        if (beginning.shownBefore) {
+            continuity = Continuity::after(*beginning.shownBefore);
+            return;
+        }
+        const std::int64_t first = beginning.first.value_or(newest);
+        continuity = Continuity{first};
+        if (first > newest) {
+            listener.notice({"waiting_for_event", "the newest event is " + std::to_string(newest) +
+                                                      "; waiting for event " +
+                                                      std::to_string(first)});
+        }
     }
 
     void waitForService(const std::stop_token& stop) {
@@ -206,11 +219,21 @@ std::int64_t greatestNumber(const Records& batch) {
 
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener) {
     const auto [fresh, missing] = continuity.accept(batch);
-    for (const MissingNumbers& numbers : missing) {
-        listener.notice({"events_missing", told(numbers)});
+    // Each gap is told where it is, so that a reader who has seen enough hears of none behind it.
+    auto gap = missing.begin();
+    const auto tellGapsBelow = [&](std::int64_t number) {
+        for (; gap != missing.end() && gap->first < number; ++gap) {
+            listener.notice({"events_missing", told(*gap)});
+        }
+    };
+    for (const std::size_t place : fresh) {
+        tellGapsBelow(numberOf(eventKind(), batch[place], "sequence_number"));
+        if (!listener.show(batch[place])) {
+            return false;
+        }
     }
-    return std::ranges::all_of(
-        fresh, [&](const std::size_t place) { return listener.show(batch[place]); });
+    tellGapsBelow(std::numeric_limits<std::int64_t>::max());
+    return true;
 }
 
 void followEvents(const Library& library, const StreamStart& start, const EventListener& listener,

@@ -46,7 +46,8 @@ public:
     Comparison(std::string_view kind, const RuleField& compared, const CodeBook& codeBook)
         : qualified{std::string{kind} + "." + std::string{compared.key}},
           field{compared},
-          codes{codeBook.codes(kindOfCodes(kind), compared.key)} {
+          codes{codeBook.codes(kindOfCodes(kind), compared.key)},
+          codesStandAt{codeBook.origin(kindOfCodes(kind), compared.key)} {
         result.field = compared.key;
     }
 
@@ -123,8 +124,9 @@ private:
         }
         // Without any codes all are unknown, and that is what the code book wants.
         if (!codes->empty() && std::ranges::find(names, name) == names.end()) {
-            refuse(setting.place, "the code book calls no code of " + qualified + " \"" + name +
-                                      "\"; known: " + joined(names));
+            refuse(setting.place, "no code of " + qualified + " is called \"" + name +
+                                      "\"; known: " + joined(names) + " (" +
+                                      std::string{codesStandAt} + ")");
         }
     }
 
@@ -161,6 +163,7 @@ private:
     std::string qualified;  ///< "disk_drives.state"
     const RuleField& field;
     const CodeBook::Codes* codes;
+    std::string_view codesStandAt;
     Condition result;
 };
 

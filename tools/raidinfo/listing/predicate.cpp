@@ -128,7 +128,15 @@ Predicate numberPredicate(const Filter& filter, const CodeBook::Meaning* meaning
                        });
 }
 
+/// Of the value as it is shown.
+Predicate shownPredicate(const Filter& filter) {
+    return [filter](const Value& value) { return textHolds(shown(value), filter); };
+}
+
 Predicate flagPredicate(const Filter& filter) {
+    if (filter.comparison == Comparison::contains) {
+        return shownPredicate(filter);
+    }
     constexpr auto words = std::to_array<std::pair<std::string_view, bool>>({{"yes", true},
                                                                              {"no", false},
                                                                              {"true", true},
@@ -151,13 +159,13 @@ Predicate statusPredicate(const Filter& filter) {
         std::ranges::find(words, filter.value) == words.end()) {
         throw incomparable(filter, "which is Normal, Warning, Critical or unknown");
     }
-    return [filter](const Value& value) { return textHolds(shown(value), filter); };
+    return shownPredicate(filter);
 }
 
 Predicate listPredicate(const Filter& filter) {
     using Numbers = std::vector<int>;
     if (filter.comparison != Comparison::contains) {
-        return [filter](const Value& value) { return textHolds(shown(value), filter); };
+        return shownPredicate(filter);
     }
     return onEach<Numbers>(filter, [wanted = wantedNumber(filter)](const Numbers& numbers) {
         return std::ranges::find(numbers, wanted) != numbers.end();

@@ -27,6 +27,10 @@ int copyOfStandardOutput() {
 
 }  // namespace
 
+bool isStandardOutput(const std::filesystem::path& file) {
+    return file == "-" || file == "/dev/stdout";
+}
+
 Output::Output() : original{copyOfStandardOutput(), "standard output"} {
     const Descriptor null{open("/dev/null", O_WRONLY | O_CLOEXEC), "cannot open /dev/null"};
     if (dup2(null.get(), STDOUT_FILENO) < 0) {

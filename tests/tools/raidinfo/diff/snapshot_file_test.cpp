@@ -41,6 +41,12 @@ TEST(SnapshotFile, YieldsItsTree) {
     EXPECT_EQ(snapshotData(file().dump(2) + "\n"), test::smallServer());
 }
 
+TEST(SnapshotFile, IsRefusedWhenItIsTheLogicalView) {
+    Json data = test::smallServer();
+    data["adapters"][0]["hot_spares"] = Json::array();
+    EXPECT_EQ(complaintAbout(with("data", data)), "not a snapshot: it is the logical view of one");
+}
+
 TEST(SnapshotFile, IsReadInEveryMinorVersion) {
     for (const Json& version : {Json(1), Json("1"), Json("1.0"), Json("1.7")}) {
         EXPECT_EQ(complaintAbout(with("schema_version", version)), "none");

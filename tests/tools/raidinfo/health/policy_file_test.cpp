@@ -104,8 +104,8 @@ INSTANTIATE_TEST_SUITE_P(
         WrongPolicy{"code_name",
                     "[[rule]]\nname = \"fan-critical\"\n"
                     "when = [\n{ field = \"status\", is = \"broken\" }]",
-                    "site.toml:4: the code book calls no code of fans.status \"broken\"; known: "
-                    "normal, warning, critical"},
+                    "site.toml:4: no code of fans.status is called \"broken\"; known: "
+                    "normal, warning, critical (codes.toml:"},
         WrongPolicy{"name_where_there_are_no_codes",
                     "[[rule]]\nname = \"fan-critical\"\nwhen = { field = \"index\", is = \"x\" }",
                     "site.toml:3: fans.index has no codes, so it is compared with a number"},

@@ -93,6 +93,7 @@ TEST_F(DriveListing, IsFilteredByTextsFlagsAndStatus) {
     EXPECT_THAT(positionsWhere({"vendor~UIL"}), ElementsAre(Value{0}));
     EXPECT_THAT(positionsWhere({"vendor="}), ElementsAre(Value{2}));
     EXPECT_THAT(positionsWhere({"smart_error=yes"}), ElementsAre(Value{1}));
+    EXPECT_THAT(positionsWhere({"smart_error~y"}), ElementsAre(Value{1}));
     EXPECT_THAT(positionsWhere({"smart_error!=true"}), ElementsAre(Value{0}, Value{2}));
     EXPECT_THAT(positionsWhere({"overall_status!=Normal"}), ElementsAre(Value{1}, Value{2}));
     EXPECT_THAT(positionsWhere({"overall_status=unknown"}), ElementsAre(Value{2}));
