@@ -57,10 +57,40 @@ TEST(Completion, OffersTheColumnsOfTheKind) {
     EXPECT_THAT(offered("raidinfo list fans --columns vendor"), IsEmpty());
 }
 
+TEST(Completion, OffersTheColumnsOfTheKindAsStartsOfAFilter) {
+    EXPECT_THAT(offered("raidinfo list fans --filter ind"), ElementsAre("index"));
+    EXPECT_THAT(offered("raidinfo list fans --filter vendor"), IsEmpty());
+    EXPECT_THAT(offered("raidinfo list --filter vendor"), Contains("vendor"));
+    EXPECT_THAT(offered("raidinfo list fans --filter status = ''"), IsEmpty());
+}
+
+TEST(Completion, OffersNoKindWhereThePositionStands) {
+    const auto replies = offered("raidinfo show fans ''");
+    EXPECT_THAT(replies, Contains("--json"));
+    EXPECT_THAT(replies, Not(Contains("fans")));
+    EXPECT_THAT(offered("raidinfo list fans fa"), IsEmpty());
+}
+
+TEST(Completion, TakesTheValueOfAnOptionForNoOperand) {
+    EXPECT_THAT(offered("raidinfo --timeout 5 sho"), ElementsAre("show"));
+    EXPECT_THAT(offered("raidinfo --from list sho"), ElementsAre("show"));
+    EXPECT_THAT(offered("raidinfo list --filter status = 0 fa"), ElementsAre("fans"));
+}
+
 TEST(Completion, OffersTheValuesOfAnOption) {
     EXPECT_THAT(offered("raidinfo list --color ''"), ElementsAre("always", "auto", "never"));
     EXPECT_THAT(offered("raidinfo --from ./completion"), ElementsAre("./completion.bash"));
     EXPECT_THAT(offered("raidinfo diff ./completion"), ElementsAre("./completion.bash"));
+    EXPECT_THAT(offered("raidinfo list '>' ./completion"), ElementsAre("./completion.bash"));
+}
+
+// bash has cut the word at the "=".
+TEST(Completion, OffersTheValuesBehindAnEqualsSign) {
+    EXPECT_THAT(offered("raidinfo list --color = al"), ElementsAre("always"));
+    EXPECT_THAT(offered("raidinfo list --color ="), ElementsAre("always", "auto", "never"));
+    EXPECT_THAT(offered("raidinfo list fans --columns = +status,ind"),
+                ElementsAre("+status,index"));
+    EXPECT_THAT(offered("raidinfo --from = ./completion"), ElementsAre("./completion.bash"));
 }
 
 }  // namespace
