@@ -54,7 +54,8 @@ void Simulator::run() {
 void Simulator::runInit(const std::string& path) {
     if (path.empty())
         return;
-    const auto script = loading(path, [&] { return parseScript(readFile(path), folderOf(path)); });
+    const auto script = loading(path, FileKind::commands,
+                                [&] { return parseScript(readFile(path), folderOf(path)); });
     for (const ScriptLine& line : script) {
         try {
             quitting = line.command(service).quit || quitting;
@@ -68,7 +69,7 @@ void Simulator::runInit(const std::string& path) {
 void Simulator::armFault(const std::string& path) {
     if (path.empty())
         return;
-    loading(path,
+    loading(path, FileKind::fault,
             [&] { service.faults().arm(std::make_shared<const FaultFile>(path), std::nullopt); });
 }
 

@@ -3,6 +3,7 @@
 #include <stdexcept>
 #include <string>
 
+#include "file_kind.h"
 #include "files.h"
 
 namespace raidsim {
@@ -28,16 +29,19 @@ private:
     ExitStatus exitStatus;
 };
 
-// Does something with a file. Its errors become StartErrors that name the file; a FileError means
-// that it cannot be read, any other that it is not understood.
+// Does something with a file of that kind. Its errors become StartErrors that name the file; a
+// FileError means that it cannot be read, any other that it is not understood.
 template <typename Action>
-auto loading(const std::string& path, Action action) {
+auto loading(const std::string& path, FileKind kind, Action action) {
+    const auto complaint = [&](const std::runtime_error& error) {
+        return path + ": " + error.what() + hintFor(path, kind);
+    };
     try {
         return action();
     } catch (const FileError& error) {
-        throw StartError(ExitStatus::noInput, path + ": " + error.what());
+        throw StartError(ExitStatus::noInput, complaint(error));
     } catch (const std::runtime_error& error) {
-        throw StartError(ExitStatus::badInput, path + ": " + error.what());
+        throw StartError(ExitStatus::badInput, complaint(error));
     }
 }
 

@@ -26,12 +26,12 @@ Scenario loadScenario(const Options& options) {
     const std::string& path = options.scenario;
     if (path.empty())
         return {};
-    return loading(path,
+    return loading(path, FileKind::scenario,
                    [&] { return parseScenario(readFile(path), folderOf(path), options.seed); });
 }
 
 std::shared_ptr<const recording::Recording> loadRecording(const std::string& path) {
-    return loading(path, [&] {
+    return loading(path, FileKind::recording, [&] {
         return std::make_shared<const recording::Recording>(
             recording::parse(readFile(path, bounds::recordingBytes)));
     });
@@ -55,7 +55,11 @@ Startup startConfiguration(const Options& options, const Scenario& scenario) {
         throw StartError(ExitStatus::usage,
                          options.scenario + " names no configuration, so CONFIG is required");
     }
-    return {loading(path, [&] { return Document::read(path); }), path, {}, usualEpoch, {}};
+    return {loading(path, FileKind::configuration, [&] { return Document::read(path); }),
+            path,
+            {},
+            usualEpoch,
+            {}};
 }
 
 }  // namespace

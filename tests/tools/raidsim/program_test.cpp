@@ -171,6 +171,17 @@ const std::vector<FailingStart> failingStarts{
      66},
     {{"--fault", "bad.fault", "system.xml"},
      "raidsim: bad.fault: line 2: unknown instruction \"explode\"\n",
+     65},
+    {{"no-config.scenario"},
+     "raidsim: no-config.scenario: line 1: [^\n]*; this looks like a scenario: use --scenario\n",
+     65},
+    {{"bad.fault"}, "raidsim: bad.fault: [^\n]*; this looks like a fault file: use --fault\n", 65},
+    {{"failing.init"},
+     "raidsim: failing.init: [^\n]*; this looks like a file of commands: use --init\n",
+     65},
+    {{"day.rec"}, "raidsim: day.rec: [^\n]*; this looks like a recording: use --replay\n", 65},
+    {{"--scenario", "system.xml"},
+     "raidsim: system.xml: [^\n]*; this looks like a configuration: give it as CONFIG\n",
      65}};
 
 TEST(Program, FailsToStartWithOneLineAndAStatus) {
