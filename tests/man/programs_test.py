@@ -41,7 +41,7 @@ def options_by_place() -> dict[tuple[str, str], set[str]]:
     for program, subcommand in SUBCOMMANDS:
         section = {"generate": "GENERATING DOCUMENTS"}.get(subcommand, "OPTIONS")
         own = program.options(subcommand) - {HELP}
-        places[str(page_of(program, subcommand)), section] = own
+        places.setdefault((str(page_of(program, subcommand)), section), set()).update(own)
     return {place: options for place, options in places.items() if options}
 
 

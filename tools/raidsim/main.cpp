@@ -1,15 +1,26 @@
+#include <algorithm>
 #include <csignal>
 #include <exception>
 #include <iostream>
+#include <string>
 
 #include "options.h"
 #include "simulator.h"
 
 namespace {
 
-int leave(raidsim::ExitStatus status, const char* message) {
+// On one line, whatever the command line holds.
+int leave(raidsim::ExitStatus status, std::string message) {
+    std::ranges::replace_if(
+        message, [](char c) { return c >= '\0' && c < ' '; }, '?');
     std::cerr << "raidsim: " << message << std::endl;
     return static_cast<int>(status);
+}
+
+int print(const std::string& text) {
+    std::cout << text << std::flush;
+    return std::cout ? static_cast<int>(raidsim::ExitStatus::ok)
+                     : leave(raidsim::ExitStatus::cannotWrite, "cannot write the output");
 }
 
 }  // namespace
@@ -22,15 +33,10 @@ int main(int argc, char** argv) {
     std::signal(SIGTTOU, SIG_IGN);
     try {
         const auto wanted = raidsim::parseOptions(argc, argv);
-        if (const auto* const help = std::get_if<raidsim::HelpWanted>(&wanted)) {
-            std::cout << help->text;
-            return static_cast<int>(raidsim::ExitStatus::ok);
-        }
-        if (const auto* const order = std::get_if<raidsim::generate::Order>(&wanted)) {
-            std::cout << raidsim::generate::generate(*order) << std::flush;
-            return static_cast<int>(std::cout ? raidsim::ExitStatus::ok
-                                              : raidsim::ExitStatus::cannotWrite);
-        }
+        if (const auto* const information = std::get_if<raidsim::Information>(&wanted))
+            return print(information->text);
+        if (const auto* const order = std::get_if<raidsim::generate::Order>(&wanted))
+            return print(raidsim::generate::generate(*order));
         raidsim::Simulator simulator(std::get<raidsim::Options>(wanted), std::cout, std::cerr);
         simulator.run();
         return static_cast<int>(raidsim::ExitStatus::ok);

@@ -28,7 +28,8 @@ struct Options {
     std::uint16_t port = 34572;
 };
 
-struct HelpWanted {
+// What was asked for instead of a service: help, the version, the completion.
+struct Information {
     std::string text;
 };
 
@@ -37,7 +38,7 @@ public:
     using std::runtime_error::runtime_error;
 };
 
-using Wanted = std::variant<Options, generate::Order, HelpWanted>;
+using Wanted = std::variant<Options, generate::Order, Information>;
 
 // Throws UsageError.
 [[nodiscard]] Wanted parseOptions(int argc, const char* const* argv);

@@ -33,6 +33,9 @@ public:
     void place(const Socket& source, int target) {
         posix_spawn_file_actions_adddup2(&actions, source.get(), target);
     }
+    void open(const char* path, int target) {
+        posix_spawn_file_actions_addopen(&actions, target, path, O_WRONLY, 0);
+    }
     [[nodiscard]] const posix_spawn_file_actions_t* get() const { return &actions; }
 
 private:
@@ -41,7 +44,8 @@ private:
 
 }  // namespace
 
-Program::Program(const std::vector<std::string>& arguments) : input(-1), output(-1), errors(-1) {
+Program::Program(const std::vector<std::string>& arguments, const char* outputFile)
+    : input(-1), output(-1), errors(-1) {
     auto [inputRead, inputWrite] = pipeEnds();
     auto [outputRead, outputWrite] = pipeEnds();
     auto [errorsRead, errorsWrite] = pipeEnds();
@@ -49,6 +53,8 @@ Program::Program(const std::vector<std::string>& arguments) : input(-1), output(
     actions.place(inputRead, STDIN_FILENO);
     actions.place(outputWrite, STDOUT_FILENO);
     actions.place(errorsWrite, STDERR_FILENO);
+    if (outputFile != nullptr)
+        actions.open(outputFile, STDOUT_FILENO);
 
     std::vector<std::string> words{RAIDSIM_PROGRAM};
     words.insert(words.end(), arguments.begin(), arguments.end());

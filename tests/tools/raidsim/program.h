@@ -9,10 +9,10 @@
 
 namespace raidsim::test {
 
-// The program raidsim as a process of its own, its three streams on pipes.
+// The program raidsim as a process of its own, its three streams on pipes, or its output in a file.
 class Program {
 public:
-    explicit Program(const std::vector<std::string>& arguments);
+    explicit Program(const std::vector<std::string>& arguments, const char* outputFile = nullptr);
     ~Program();
     Program(const Program&) = delete;
     Program& operator=(const Program&) = delete;
