@@ -223,6 +223,20 @@ TEST(EventsCommand, EndsAfterAsManyEventsAsWereAskedFor) {
     EXPECT_THAT(service.request(2), HasSubstr(">5</as:start>"));
 }
 
+TEST(EventsCommand, TellsAGapBeforeTheEventBehindIt) {
+    const ScriptedService service{{newest(9), awaited(), answering(eventBatch({5, 7, 9}))}};
+    const Result result = run({"events", "--json", "--since", "5", "--count", "2"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(5, 7));
+    EXPECT_EQ(result.errors, "raidinfo: event 6 is missing\n") << "nobody has come to event 8";
+}
+
+TEST(EventsCommand, SaysThatItWaitsForAnEventThatIsNotThereYet) {
+    const ScriptedService service{{newest(3), awaited(), answering(eventBatch({8}))}};
+    const Result result = run({"events", "--json", "--since", "8", "--count", "1"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(8));
+    EXPECT_EQ(result.errors, "raidinfo: the newest event is 3; waiting for event 8\n");
+}
+
 TEST(EventsCommand, GoesOnWhereItEndedTheLastTime) {
     const ScriptedService service{{newest(9), awaited(), answering(eventBatch({5, 6})), newest(9),
                                    awaited(), answering(eventBatch({6, 7, 8}))}};

@@ -7,6 +7,8 @@
 
 #include "documents.h"
 #include "program.h"
+#include "support/busy_service.h"
+#include "support/files.h"
 #include "support/scripted_service.h"
 
 namespace raidinfo::test {
@@ -14,11 +16,13 @@ namespace {
 
 using nlohmann::json;
 using raid::test::answering;
+using raid::test::BusyService;
 using raid::test::Connection;
 using raid::test::End;
 using raid::test::newestEventDocument;
 using raid::test::ScriptedService;
 using raid::test::Stage;
+using raid::test::writeFile;
 using testing::HasSubstr;
 using testing::MatchesRegex;
 
@@ -82,6 +86,25 @@ TEST(FailingProgram, SaysThatTheEventsAreMalformed) {
 TEST(FailingProgram, GivesUpOnASilentServiceAfterTheTimeout) {
     const ScriptedService service{{Connection{.end = End::hold}}};
     expectFailure(run({"list", "--timeout", "1"}), 69, "--timeout");
+}
+
+TEST(FailingProgram, GivesUpOnAServiceThatAcceptsNoConnection) {
+    const BusyService service;
+    expectFailure(run({"list", "--timeout", "1"}), 69, "--timeout");
+}
+
+TEST(FailingProgram, SaysWhichFileLacksTheCodeThatThePolicyNeeds) {
+    writeFile("own-codes.toml", "[disk_drives.state]\n1 = \"fine\"\n");
+    const Result result = run({"health", "--codes", "own-codes.toml"});
+    EXPECT_EQ(result.status, 3);
+    EXPECT_THAT(result.errors, HasSubstr("known: fine (own-codes.toml:1)"));
+}
+
+TEST(FailingProgram, SaysWhatEachListCouldBeFilteredBy) {
+    expectFailure(run({"list", "--filter", "state=onlin"}), 64,
+                  "logical_drives: \"onlin\" cannot be compared with state, which is a number or, "
+                  "for = and !=, one of degraded, ");
+    expectFailure(run({"list", "--filter", "colour=red"}), 64, "no list has all the columns");
 }
 
 TEST(FailingProgram, IsInterruptedWhileItWaitsForTheInventory) {

@@ -93,6 +93,16 @@ TEST_F(Recording, ShowsWhatTheServiceShowedWithoutIt) {
     EXPECT_EQ(dataOf(run(from({"events", "--json"})))["message_string"], "Drive & failed");
 }
 
+TEST_F(Recording, IsPrintedWhereItsFileIsTheStandardOutput) {
+    const Simulator simulator{"small-server.xml"};
+    const Result result = run({"record", "--for", "0", "-", "--json"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.output, testing::StartsWith("raid-recording 1 "));
+    EXPECT_FALSE(std::filesystem::exists("-"));
+    std::ofstream{file} << result.output;
+    EXPECT_EQ(dataOf(run(from({"list", "--json"})))["disk_drives"].size(), 6U);
+}
+
 TEST_F(Recording, IsShownAlsoWhileAServiceHasOtherThingsToTell) {
     {
         const Simulator simulator{"small-server.xml"};

@@ -7,7 +7,6 @@
 #include "inventory/value.h"
 #include "text/printable.h"
 
-
 namespace raidinfo {
 namespace {
 

@@ -14,9 +14,6 @@ namespace {
 using completion::Form;
 using completion::Words;
 
-/// The type of --filter's value.
-constexpr auto condition = "KEY=VALUE";
-
 Words columnKeys(const Kind& kind) {
     Words keys;
     for (const ListColumn& column : columnsOf(kind)) {
@@ -29,7 +26,7 @@ Words columnKeys(const Kind& kind) {
 std::vector<completion::Values> inventoryValues() {
     completion::Values kinds{value_type::kind, Form::word};
     completion::Values columns{value_type::columns, Form::list, {"all"}};
-    completion::Values conditions{condition, Form::start};
+    completion::Values conditions{value_type::filter, Form::start};
     std::set<std::string> ofAnyKind;
     for (const Kind& kind : inventoryKinds()) {
         const std::string key{kind.key};

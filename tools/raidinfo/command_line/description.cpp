@@ -90,7 +90,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          app.add_option("--filter", words.filters,
                         "Only records with this, such as state!=online or size>1000; the operators "
                         "are = != < <= > >= and ~ (contains); may be repeated")
-             ->type_name("FILTER")
+             ->type_name(value_type::filter)
              ->expected(1)
              ->take_all();
          app.add_flag("--noheadings", words.noHeadings, "Print no titles");
@@ -174,18 +174,18 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      "  raidinfo health --explain\n"
      "  raidinfo health --nagios",
      [](CLI::App& app, Words& words) {
-         CLI::Option* const explain =
-             app.add_flag("--explain", words.explain,
-                          "Name the rule, the record, the field and its value for each finding");
-         app.add_flag("--nagios", words.nagios, "Print the one line of a monitoring plugin")
-             ->excludes(explain)
-             ->excludes(app.get_parent()->get_option("--json"));
+         app.add_flag("--explain", words.explain,
+                      "Name the rule, the record, the field and its value for each finding");
+         app.add_flag("--nagios", words.nagios, "Print the one line of a monitoring plugin");
          app.add_option("--policy", words.policy, "Change the rules by this file")
              ->type_name(value_type::file)
              ->check(notEmpty())
              ->take_last();
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {
+         if (words.nagios && (words.explain || words.json)) {
+             throw Failure{ExitStatus::usage, "--nagios goes neither with --explain nor --json"};
+         }
          return HealthOptions{words.explain, words.nagios, limitOf(words),
                               optionalPath(words.policy)};
      },

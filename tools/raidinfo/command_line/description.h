@@ -73,6 +73,7 @@ inline constexpr auto kind = "KIND";
 inline constexpr auto columns = "COLUMNS";
 inline constexpr auto file = "FILE";
 inline constexpr auto when = "WHEN";
+inline constexpr auto filter = "FILTER";
 }  // namespace value_type
 
 /// The values of value_type::when.

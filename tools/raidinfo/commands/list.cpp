@@ -17,8 +17,8 @@ bool haveColumns(const Kind& kind, const std::vector<Filter>& filters) {
                                [&kind](const Filter& filter) { return concerns(filter, kind); });
 }
 
-/// The kinds to list: the one asked for, or all of which the filters can hold. In "state=rebuilding"
-/// that is every kind with such a state.
+/// The kinds to list: the one asked for, or all of which the filters can hold. In
+/// "state=rebuilding" that is every kind with such a state.
 std::vector<const Kind*> kindsOf(const ListOptions& list, const CodeBook& book) {
     if (list.kind != nullptr) {
         checkFilters(list.filters, *list.kind, book);
@@ -32,8 +32,8 @@ std::vector<const Kind*> kindsOf(const ListOptions& list, const CodeBook& book) 
                 checkFilters(list.filters, kind, book);
                 kinds.push_back(&kind);
             } catch (const Failure& failure) {
-                trouble += (trouble.empty() ? "" : "; ") + std::string{kind.key} + ": " +
-                           failure.what();
+                trouble +=
+                    (trouble.empty() ? "" : "; ") + std::string{kind.key} + ": " + failure.what();
             }
         }
     }

@@ -2,7 +2,6 @@
 
 #include "inventory/value.h"
 
-
 namespace raidinfo {
 
 std::string eventLine(const Record& event) {

@@ -155,8 +155,9 @@ private:
         add(flagOf(setting), flagOf(setting) ? "known" : "not known");
     }
 
-    void add(Value operand, const std::string& text) {
-        result.operands.push_back(std::move(operand));
+    template <typename T>
+    void add(const T& operand, const std::string& text) {
+        result.operands.emplace_back(operand);
         result.text += text;
     }
 

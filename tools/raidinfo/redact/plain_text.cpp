@@ -5,7 +5,6 @@
 
 #include "text/decoded.h"
 
-
 namespace raidinfo::redact {
 namespace {
 

@@ -9,7 +9,6 @@
 
 #include "text/width.h"
 
-
 namespace raidinfo {
 namespace {
 

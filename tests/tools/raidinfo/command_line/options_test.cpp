@@ -137,7 +137,9 @@ TEST(Options, ThatAreWrongAreAUsageFailure) {
           Arguments{"list", "--timeout", "-1"}, Arguments{"list", "--timeout", "soon"},
           Arguments{"list", "--library"}, Arguments{"list", "--filter", "state"},
           Arguments{"list", "fans", "-o", ","}, Arguments{"events", "--count", "0"},
-          Arguments{"watch", "--interval", "0"}, Arguments{"snapshot"}, Arguments{"diff"}}) {
+          Arguments{"watch", "--interval", "0"}, Arguments{"snapshot"}, Arguments{"diff"},
+          Arguments{"health", "--nagios", "--explain"}, Arguments{"health", "--nagios", "--json"},
+          Arguments{"--json", "health", "--nagios"}}) {
         EXPECT_NE(complaint(wrong), "accepted") << testing::PrintToString(wrong);
     }
 }

@@ -107,6 +107,13 @@ TEST_F(DiffCommand, ComparesWhatTreePrints) {
     expectResult(diff({before}), 1, failedDrive);
 }
 
+TEST_F(DiffCommand, ComparesASnapshotThatWasPrinted) {
+    for (const char* const output : {"-", "/dev/stdout"}) {
+        writeFile(before, run({"snapshot", output, "--json"}).output);
+        expectResult(diff({before}), 0, nothing);
+    }
+}
+
 TEST_F(DiffCommand, TakesTheNamesOfCodesFromTheBookThatItIsGiven) {
     saveBeforeAndAfterTheFailure();
     writeFile(other, "[disk_drives.state]\n1 = \"ready\"\n4 = \"predicted to fail\"\n");

@@ -18,10 +18,11 @@ TEST(RowsJson, HaveAMemberForEachColumn) {
     snapshot.of(KindId::fan) = {
         sample(kindOf(KindId::fan), {{"fan_name", "Disk Drive 15"}, {"status", -2147483647 - 1}})};
     const Json rows = rowsJson(listingOf(kindOf(KindId::fan), snapshot, {"adapters", {}}));
-    EXPECT_EQ(rows.dump(),
-              R"([{"position":0,"index":null,"enclosure":null,"channel":null,"adapter":null,"fan_name":"Disk Drive 15","status_name":"",)"
-              R"("channel_name":"","adapter_name":"","status":-2147483648,"enclosure_id":0,)"
-              R"("channel_id":0,"adapter_id":0}])");
+    EXPECT_EQ(
+        rows.dump(),
+        R"([{"position":0,"index":null,"enclosure":null,"channel":null,"adapter":null,"fan_name":"Disk Drive 15","status_name":"",)"
+        R"("channel_name":"","adapter_name":"","status":-2147483648,"enclosure_id":0,)"
+        R"("channel_id":0,"adapter_id":0}])");
 }
 
 TEST(EventJson, HasEveryField) {
