@@ -14,7 +14,6 @@ set(publicHeaders
     agent/exchange.h
     agent/saved_answers.h
     diag/debug.h
-    events/raid_events.h
     flat/lists.h
     flat/packing.h
     flat/snapshot.h
@@ -22,6 +21,7 @@ set(publicHeaders
     model/channels_and_drives.h
     model/enclosures.h
     model/logical_drives.h
+    model/raid_events.h
     model/system_and_adapter.h
     xml/parse_def_unit.h
     xml/raid_xml_error.h

@@ -6,7 +6,7 @@
 #include <set>
 #include <string>
 
-#include "events/event_classes.h"
+#include "model/event_classes.h"
 #include "model/classes.h"
 
 namespace {

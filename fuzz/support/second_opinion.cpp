@@ -9,7 +9,7 @@
 #include <memory>
 #include <string_view>
 
-#include "events/event_classes.h"
+#include "model/event_classes.h"
 
 namespace raid::fuzz {
 namespace {

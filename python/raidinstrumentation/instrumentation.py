@@ -82,25 +82,25 @@ class RAIDInstrumentation:
         self._inventory = self._result(call, timeout)
         return self._inventory
 
-    def events(self, since: int | None = None, *, timeout: float | None = PATIENCE) -> EventStream:
-        """The events that come after the one with the number since, or from the newest one on.
+    def events(self, after: int | None = None, *, timeout: float | None = PATIENCE) -> EventStream:
+        """The events that come after the one with this number, or from the newest one on.
 
         0 is before the first event that the service keeps. To resume later, store the
         sequence_number of the last event that was dealt with.
 
         Asks the service for its newest event, so that none is missed between this call and the
-        first next(). Raises ServiceUnavailable as refresh does, and EventLogRestarted if that event
-        is older than since. The timeout is that of this call, not of the stream.
+        first next(). Raises ServiceUnavailable as refresh does, and EventLogRestarted if that has a
+        lower number. The timeout is that of this call, not of the stream.
         """
-        if since is not None and not 0 <= since <= LARGEST_NUMBER:
-            raise ValueError(f"event numbers range from 0 to {LARGEST_NUMBER}, unlike {since}")
+        if after is not None and not 0 <= after <= LARGEST_NUMBER:
+            raise ValueError(f"event numbers range from 0 to {LARGEST_NUMBER}, unlike {after}")
         library = self._library
         newest = self._result(Call(library.newest_event, library.cancel), timeout)
         if newest is None:
             raise ServiceUnavailable
-        if since is not None:
-            check_newest(newest, since)
-        stream = EventStream(library, newest if since is None else since + 1)
+        if after is not None:
+            check_newest(newest, after)
+        stream = EventStream(library, newest if after is None else after + 1)
         self._streams.add(stream)
         if self._is_closed:
             stream.cancel()

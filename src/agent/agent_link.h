@@ -1,6 +1,6 @@
 #pragma once
 
-#include "../events/raid_events.h"
+#include "../model/raid_events.h"
 #include "../model/system_and_adapter.h"
 
 // What the library asks of the RAID management service. Nothing here reports a failure but

@@ -2,11 +2,11 @@
 
 #include <vector>
 
-#include "../events/raid_events.h"
 #include "../model/arrays.h"
 #include "../model/channels_and_drives.h"
 #include "../model/enclosures.h"
 #include "../model/logical_drives.h"
+#include "../model/raid_events.h"
 #include "../model/system_and_adapter.h"
 
 // The published lists. Each holds its own copies of model objects, addressed by zero-based

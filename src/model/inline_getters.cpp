@@ -5,7 +5,7 @@
 #include <type_traits>
 #include <utility>
 
-#include "events/raid_events.h"
+#include "model/raid_events.h"
 #include "model/arrays.h"
 #include "model/channels_and_drives.h"
 #include "model/enclosures.h"

@@ -3,7 +3,7 @@
 #include <cstddef>
 #include <string_view>
 
-#include "events/raid_events_vocabulary.h"
+#include "model/raid_events_vocabulary.h"
 #include "model/system_and_adapter_vocabulary.h"
 
 namespace raid::test {

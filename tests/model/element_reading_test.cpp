@@ -11,7 +11,7 @@
 #include <vector>
 
 #include "classes.h"
-#include "events/event_classes.h"
+#include "model/event_classes.h"
 #include "support/elements.h"
 #include "support/files.h"
 #include "support/fresh_library.h"

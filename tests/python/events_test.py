@@ -23,8 +23,8 @@ from support.waiting import PATIENCE
 AWAITED = "there are events"
 
 
-def numbers_of(raid: RAIDInstrumentation, since: int | None, count: int) -> list[int]:
-    stream = raid.events(since)
+def numbers_of(raid: RAIDInstrumentation, after: int | None, count: int) -> list[int]:
+    stream = raid.events(after)
     return [event.sequence_number for event in itertools.islice(stream, count)]
 
 
@@ -133,10 +133,10 @@ def test_the_largest_number_there_is_can_be_followed(raid: RAIDInstrumentation) 
         assert all(f">{largest}</as:start>" in request for request in service.requests("events"))
 
 
-@pytest.mark.parametrize("since", [-1, 2**31])
-def test_a_number_that_no_event_has_is_refused(raid: RAIDInstrumentation, since: int) -> None:
+@pytest.mark.parametrize("after", [-1, 2**31])
+def test_a_number_that_no_event_has_is_refused(raid: RAIDInstrumentation, after: int) -> None:
     with pytest.raises(ValueError, match="event numbers"):
-        raid.events(since)
+        raid.events(after)
 
 
 def test_a_service_that_is_not_there_is_unavailable(raid: RAIDInstrumentation) -> None:

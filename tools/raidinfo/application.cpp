@@ -17,8 +17,8 @@
 #include "health/verdict.h"
 #include "json/envelope.h"
 #include "json/schema.h"
+#include "library/library.h"
 #include "overloaded.h"
-#include "source/library.h"
 #include "system/cancellable.h"
 #include "system/output.h"
 

@@ -11,19 +11,13 @@
 
 #include "documents.h"
 #include "program.h"
-#include "support/scripted_service.h"
+#include "scripted.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
-using raid::test::answering;
-using raid::test::Connection;
-using raid::test::End;
 using raid::test::Gate;
-using raid::test::newestEventDocument;
-using raid::test::ScriptedService;
-using raid::test::Stage;
 using testing::ElementsAre;
 using testing::HasSubstr;
 

@@ -12,18 +12,11 @@
 
 #include "documents.h"
 #include "program.h"
+#include "scripted.h"
 #include "simulator.h"
-#include "support/scripted_service.h"
 
 namespace raidinfo::test {
 namespace {
-
-using raid::test::answering;
-using raid::test::Connection;
-using raid::test::End;
-using raid::test::newestEventDocument;
-using raid::test::ScriptedService;
-using raid::test::Stage;
 
 int statusInShell(const std::string& prefix, const std::string& command) {
     return Program{{"/bin/sh", "-c", prefix + "exec \"$0\" " + command, RAIDINFO_PROGRAM}}

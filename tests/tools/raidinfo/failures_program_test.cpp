@@ -7,21 +7,15 @@
 
 #include "documents.h"
 #include "program.h"
+#include "scripted.h"
 #include "support/busy_service.h"
 #include "support/files.h"
-#include "support/scripted_service.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
-using raid::test::answering;
 using raid::test::BusyService;
-using raid::test::Connection;
-using raid::test::End;
-using raid::test::newestEventDocument;
-using raid::test::ScriptedService;
-using raid::test::Stage;
 using raid::test::writeFile;
 using testing::HasSubstr;
 using testing::MatchesRegex;

@@ -6,14 +6,12 @@
 
 #include "documents.h"
 #include "program.h"
-#include "support/scripted_service.h"
+#include "scripted.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
-using raid::test::answering;
-using raid::test::ScriptedService;
 using testing::HasSubstr;
 using testing::StartsWith;
 

@@ -12,20 +12,14 @@
 
 #include "documents.h"
 #include "program.h"
+#include "scripted.h"
 #include "simulator.h"
 #include "support/files.h"
-#include "support/scripted_service.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
-using raid::test::answering;
-using raid::test::Connection;
-using raid::test::End;
-using raid::test::newestEventDocument;
-using raid::test::ScriptedService;
-using raid::test::Stage;
 using testing::HasSubstr;
 
 json dataOf(const Result& result) {

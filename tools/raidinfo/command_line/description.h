@@ -6,38 +6,9 @@
 #include <vector>
 
 #include "command_line/options.h"
+#include "command_line/words.h"
 
 namespace raidinfo {
-
-/// The words of the command line as they were given.
-struct Words {
-    bool json = false;
-    std::string color;
-    std::string library;
-    std::string recording;
-    std::string codes;
-    int timeout = 0;
-
-    std::string kind;
-    int position = 0;
-    std::string columns;
-    std::vector<std::string> filters;
-    bool noHeadings = false;
-    bool logical = false;
-    int since = 0;
-    int count = 0;
-    std::string command;
-    std::string state;
-    int interval = 0;
-    bool explain = false;
-    bool nagios = false;
-    std::string policy;
-    std::string file;
-    std::string before;
-    std::string after;
-    bool redact = false;
-    int duration = 0;
-};
 
 /// The command line with all its options and their explanations, from which it is parsed, explained
 /// and completed. Its parts point to each other.
@@ -60,21 +31,6 @@ private:
     Words words;
     std::unique_ptr<CLI::App> parser;
 };
-
-/// The subcommands' names, separated by commas.
-[[nodiscard]] std::string subcommandNames();
-
-/// The kinds' keys, separated by commas.
-[[nodiscard]] std::string kindNames();
-
-// What an option's value is, by which completion knows what to offer.
-namespace value_type {
-inline constexpr auto kind = "KIND";
-inline constexpr auto columns = "COLUMNS";
-inline constexpr auto file = "FILE";
-inline constexpr auto when = "WHEN";
-inline constexpr auto filter = "FILTER";
-}  // namespace value_type
 
 /// The values of value_type::when.
 [[nodiscard]] std::vector<std::string> colorChoices();

@@ -3,6 +3,7 @@
 #include <CLI/CLI.hpp>
 
 #include "command_line/description.h"
+#include "command_line/subcommands.h"
 #include "exit_status.h"
 
 namespace raidinfo {

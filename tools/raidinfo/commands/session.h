@@ -9,11 +9,11 @@
 #include "command_line/options.h"
 #include "inventory/tree.h"
 #include "json/envelope.h"
+#include "library/library.h"
 #include "presentation/grid.h"
 #include "presentation/terminal.h"
 #include "recording/recording.h"
 #include "source/inventory.h"
-#include "source/library.h"
 #include "system/output.h"
 
 namespace raidinfo {

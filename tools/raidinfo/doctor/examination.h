@@ -8,7 +8,7 @@
 #include <string_view>
 
 #include "exit_status.h"
-#include "source/library.h"
+#include "library/library.h"
 
 namespace raidinfo {
 

@@ -3,7 +3,7 @@
 #include <filesystem>
 #include <string>
 
-#include "source/library.h"
+#include "library/library.h"
 
 namespace raidinfo {
 

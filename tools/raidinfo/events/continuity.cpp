@@ -6,6 +6,7 @@
 #include <set>
 #include <string_view>
 
+#include "library/library.h"
 #include "overloaded.h"
 
 namespace raidinfo {
@@ -14,9 +15,9 @@ namespace {
 /// As many events are known by their content, and as many gaps may still be filled.
 constexpr std::size_t memory = 10'000;
 
-/// The library asks for 101 numbers at once. If it begins so far below the last one shown, there is
-/// still one ahead among them.
-constexpr std::int64_t overlap = 99;
+/// If the library begins to ask so far below the last one shown, there is still one ahead among
+/// the numbers that it asks for.
+constexpr std::int64_t overlap = numbersAsked - 2;
 
 std::int64_t numberOf(const Record& event) {
     return raidinfo::numberOf(eventKind(), event, "sequence_number");

@@ -14,9 +14,6 @@ namespace {
 /// An answering service whose events could not be read this often in a row sends malformed ones.
 constexpr int malformedReads = 5;
 
-/// The library asks for so many numbers at once.
-constexpr std::int64_t numbersAsked = 101;
-
 std::string told(const MissingNumbers& missing) {
     return missing.first == missing.last ? "event " + std::to_string(missing.first) + " is missing"
                                          : "events " + std::to_string(missing.first) + " to " +
@@ -206,15 +203,6 @@ bool beginsAnew(Continuity& continuity, const Records& batch, bool wentBack,
                                           "; it has begun to count anew"});
     continuity.beginAnew();
     return true;
-}
-
-std::int64_t greatestNumber(const Records& batch) {
-    std::int64_t greatest = 0;
-    for (const Record& event : batch) {
-        greatest =
-            std::max<std::int64_t>(greatest, numberOf(eventKind(), event, "sequence_number"));
-    }
-    return greatest;
 }
 
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener) {

@@ -9,7 +9,7 @@
 
 #include "events/continuity.h"
 #include "inventory/records.h"
-#include "source/library.h"
+#include "library/library.h"
 
 namespace raidinfo {
 
@@ -45,9 +45,6 @@ void followEvents(const Library& library, const StreamStart& start, const EventL
 /// numbers went back. Then it is told, and the continuity begins anew.
 bool beginsAnew(Continuity& continuity, const Records& batch, bool wentBack,
                 const EventListener& listener);
-
-/// The greatest number in a batch, 0 if there is none.
-[[nodiscard]] std::int64_t greatestNumber(const Records& batch);
 
 /// Shows a batch; returns false when the listener has seen enough.
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener);

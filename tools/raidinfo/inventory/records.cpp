@@ -1,5 +1,6 @@
 #include "inventory/records.h"
 
+#include <algorithm>
 #include <charconv>
 #include <string_view>
 #include <utility>
@@ -29,6 +30,15 @@ std::vector<int> parsedNumbers(std::string_view list) {
 
 int numberOf(const Kind& kind, const Record& record, std::string_view key) {
     return std::get<int>(record.at(static_cast<std::size_t>(fieldIndex(kind, key))));
+}
+
+std::int64_t greatestNumber(const Records& events) {
+    std::int64_t greatest = 0;
+    for (const Record& event : events) {
+        greatest =
+            std::max<std::int64_t>(greatest, numberOf(eventKind(), event, "sequence_number"));
+    }
+    return greatest;
 }
 
 RecordReader::RecordReader(Library library) : lib{std::move(library)} {}

@@ -2,14 +2,15 @@
 
 #include <array>
 #include <cstddef>
+#include <cstdint>
 #include <optional>
 #include <string>
 #include <vector>
 
 #include "inventory/kinds.h"
 #include "inventory/value.h"
-#include "source/library.h"
-#include "source/text_buffer.h"
+#include "library/library.h"
+#include "library/text_buffer.h"
 
 namespace raidinfo {
 
@@ -19,6 +20,9 @@ using Records = std::vector<Record>;
 
 /// The value of the field with this key, which must be a number of the kind.
 [[nodiscard]] int numberOf(const Kind& kind, const Record& record, std::string_view key);
+
+/// The greatest sequence number of events, 0 if there are none.
+[[nodiscard]] std::int64_t greatestNumber(const Records& events);
 
 /// The inventory as it stood at one moment: the records of each kind by position.
 class Snapshot {

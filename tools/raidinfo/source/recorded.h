@@ -4,9 +4,9 @@
 #include <optional>
 #include <string>
 
+#include "library/library.h"
 #include "recording/recording.h"
 #include "source/inventory.h"
-#include "source/library.h"
 
 namespace raidinfo {
 

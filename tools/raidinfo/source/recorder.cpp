@@ -21,9 +21,6 @@ namespace {
 using recording::Question;
 using Clock = std::chrono::steady_clock;
 
-/// The library asks for so many numbers at once, and so does the recorder.
-constexpr std::int64_t numbersAsked = 101;
-
 class Recorder {
 public:
     Recorder(const Library& loaded, const EntrySink& destination, std::stop_token whenOver)
@@ -132,15 +129,7 @@ private:
     /// The greatest number of a batch, 0 in an empty one; nothing where it cannot be read.
     [[nodiscard]] std::optional<std::int64_t> greatestIn(const std::optional<std::string>& events) {
         const auto batch = events ? eventsIn(library, reader, *events) : std::nullopt;
-        if (!batch) {
-            return std::nullopt;
-        }
-        std::int64_t greatest = 0;
-        for (const Record& event : *batch) {
-            const std::int64_t number = numberOf(eventKind(), event, "sequence_number");
-            greatest = std::max(greatest, number);
-        }
-        return greatest;
+        return batch ? std::optional{greatestNumber(*batch)} : std::nullopt;
     }
 
     const Library& library;

@@ -5,8 +5,8 @@
 #include <optional>
 #include <stop_token>
 
+#include "library/library.h"
 #include "recording/recording.h"
-#include "source/library.h"
 
 namespace raidinfo {
 

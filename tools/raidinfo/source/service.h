@@ -2,8 +2,8 @@
 
 #include <stop_token>
 
+#include "library/library.h"
 #include "source/inventory.h"
-#include "source/library.h"
 
 namespace raidinfo {
 

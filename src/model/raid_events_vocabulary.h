@@ -1,6 +1,6 @@
 #pragma once
 
-#include "events/raid_events.h"
+#include "model/raid_events.h"
 #include "xml/element_reader.h"
 
 // What the readers know of each element, row by row.

@@ -1,4 +1,4 @@
-#include "source/library.h"
+#include "library/library.h"
 
 #include <dlfcn.h>
 

@@ -1,6 +1,6 @@
-#include "events/raid_events.h"
+#include "model/raid_events.h"
 
-#include "events/raid_events_vocabulary.h"
+#include "model/raid_events_vocabulary.h"
 
 RAIDEvent::RAIDEvent(const char* text, int length, int* consumed) {
     raid::xml::readElement(*this, text, length, consumed);

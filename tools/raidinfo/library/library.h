@@ -6,6 +6,9 @@
 
 namespace raidinfo {
 
+/// The library asks for the events of so many numbers at once.
+constexpr int numbersAsked = 101;
+
 /// The loaded libRAIDInstrumentation, unloaded with its last copy. Everything the program knows of
 /// the library goes through the exported names looked up here.
 class Library {

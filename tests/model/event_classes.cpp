@@ -1,7 +1,7 @@
-#include "events/event_classes.h"
+#include "model/event_classes.h"
 
-#include "events/raid_events.h"
 #include "model/describe.h"
+#include "model/raid_events.h"
 
 namespace raid::test {
 

@@ -1,4 +1,4 @@
-#include "source/text_buffer.h"
+#include "library/text_buffer.h"
 
 #include <sys/mman.h>
 #include <unistd.h>

@@ -5,7 +5,7 @@
 #include <string>
 #include <vector>
 
-#include "events/raid_events.h"
+#include "model/raid_events.h"
 #include "support/elements.h"
 #include "support/files.h"
 #include "support/fresh_library.h"

@@ -1,6 +1,6 @@
-#include "events/raid_events_vocabulary.h"
 #include "flat/accessors.h"
 #include "flat/lists.h"
+#include "model/raid_events_vocabulary.h"
 
 namespace {
 

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <span>
+#include <string>
+
+#include "command_line/words.h"
+
+namespace raidinfo {
+
+/// A subcommand: its name, its help, its options, and what is made of them.
+struct Subcommand {
+    const char* name;
+    const char* summary;
+    const char* examples;
+    void (*declare)(CLI::App&, Words&);
+    CommandOptions (*read)(const CLI::App&, const Words&);
+    bool limited = true;  ///< --timeout counts
+};
+
+/// In the order of CommandOptions.
+[[nodiscard]] std::span<const Subcommand> allSubcommands() noexcept;
+
+/// The kinds' keys, separated by commas.
+[[nodiscard]] std::string kindNames();
+
+/// The subcommands' names, separated by commas.
+[[nodiscard]] std::string subcommandNames();
+
+}  // namespace raidinfo
