@@ -19,6 +19,7 @@
 #include "json/schema.h"
 #include "library/library.h"
 #include "overloaded.h"
+#include "source/service_failures.h"
 #include "system/cancellable.h"
 #include "system/output.h"
 
@@ -48,13 +49,19 @@ int runInLibrary(const Options& options, const Output& output) {
                        [&session](const auto& command) { return runCommand(session, command); }},
             options.command);
     };
-    const Ending ending =
-        cancellable.run(work, library.function<void()>("cancelGetEvent"), options.limit);
+    const Ending ending = cancellable.run(work, library.function<void()>("cancelGetEvent"),
+                                          options.limitOf(Limited::program));
     if (ending.timedOut) {
-        throw Failure{ExitStatus::serviceUnavailable,
-                      "the RAID management service gave no answer within the --timeout"};
+        throw noAnswerInTime();
     }
     return ending.signal ? signalExitBase + *ending.signal : status;
+}
+
+/// A monitoring system takes any other status for that of a plugin that is broken.
+int tellMonitoring(const Failure& failure, const Output& output) {
+    const health::Verdict unknown = health::unknownBecause(failure.what());
+    output.write(health::nagiosLine(unknown));
+    return health::exitStatus(unknown);
 }
 
 /// Tells of a failure, and returns the exit status that it has in this subcommand.
@@ -70,11 +77,9 @@ int fail(const Failure& failure, const Options& options, const Output& output) {
         return trouble;
     }
     if (const auto* const health = std::get_if<HealthOptions>(&options.command)) {
-        const health::Verdict unknown = health::unknownBecause(failure.what());
-        if (health->nagios && !options.json && canWrite) {
-            output.write(health::nagiosLine(unknown));
-        }
-        return health::exitStatus(unknown);
+        return health->nagios && canWrite
+                   ? tellMonitoring(failure, output)
+                   : health::exitStatus(health::unknownBecause(failure.what()));
     }
     return static_cast<int>(failure.status());
 }
@@ -88,15 +93,24 @@ int run(const Options& options, const Output& output) {
         return runInLibrary(options, output);
     } catch (const Failure& failure) {
         return fail(failure, options, output);
+    } catch (const std::exception& error) {
+        return fail({ExitStatus::internalError, error.what()}, options, output);
     }
 }
 
 /// Of a command line that makes no sense, hence no Options.
 int refuse(const Failure& failure, std::span<const char* const> arguments, const Output& output) {
+    const auto isThere = [arguments](std::string_view word) {
+        return std::ranges::any_of(arguments, [word](std::string_view argument) {
+            return argument == word || (argument.starts_with(word) && argument[word.size()] == '=');
+        });
+    };
     complain(failure.what());
-    if (std::ranges::find(arguments, std::string_view{"--json"}) != arguments.end()) {
+    if (isThere("--json")) {
         output.write(documentLine(
             enveloped({"none", ""}, {{troubleCode(failure.status()), failure.what()}}, nullptr)));
+    } else if (isThere("health") && isThere("--nagios")) {
+        return tellMonitoring(failure, output);
     }
     return static_cast<int>(failure.status());
 }

@@ -1,7 +1,9 @@
 #pragma once
 
+#include <array>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 
 namespace raidinfo {
 
@@ -20,6 +22,26 @@ enum class ExitStatus : int {
     outputFailed = 74,
     malformedAnswer = 76,
 };
+
+/// What programs and people are told of an exit status.
+struct StatusWords {
+    ExitStatus status;
+    std::string_view code;
+    std::string_view meaning;
+};
+
+inline constexpr auto statusWords = std::to_array<StatusWords>({
+    {ExitStatus::ok, "", "done"},
+    {ExitStatus::usage, "usage", "the command line is wrong"},
+    {ExitStatus::badInput, "bad_input", "a file is not what it should be"},
+    {ExitStatus::noInput, "no_input", "a file cannot be read"},
+    {ExitStatus::serviceUnavailable, "service_unavailable", "the service does not answer"},
+    {ExitStatus::internalError, "internal_error", "internal error, for example no memory"},
+    {ExitStatus::unusableLibrary, "unusable_library", "the library cannot be used"},
+    {ExitStatus::cannotCreate, "cannot_create", "a file cannot be written"},
+    {ExitStatus::outputFailed, "output_failed", "the output cannot be written"},
+    {ExitStatus::malformedAnswer, "malformed_answer", "the service's answer is malformed"},
+});
 
 constexpr int signalExitBase = 128;
 

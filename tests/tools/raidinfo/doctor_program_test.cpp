@@ -58,6 +58,16 @@ TEST(DoctorCommand, GivesUpOnASilentService) {
     EXPECT_THAT(result.output, ContainsRegex("Service answers +bad"));
 }
 
+TEST(DoctorCommand, TellsASilentConfigurationFromAMalformedOne) {
+    const ScriptedService service{
+        {probe, answering(newestEventDocument("7")), Connection{.end = End::hold}}};
+    const Result result = run({"doctor", "--timeout", "1", "--json"});
+    EXPECT_EQ(result.status, 69);
+    const json document = json::parse(result.output);
+    EXPECT_EQ(document["complete"], false);
+    EXPECT_THAT(document["errors"][0]["message"], HasSubstr("--timeout"));
+}
+
 // It has not even come to accept the connection, for others wait before it.
 TEST(DoctorCommand, GivesUpOnAServiceThatAcceptsNoConnection) {
     const BusyService service;

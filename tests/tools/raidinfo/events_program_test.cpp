@@ -242,6 +242,32 @@ TEST(EventsCommand, GoesOnWhereItEndedTheLastTime) {
     std::remove("events.state");
 }
 
+TEST(EventsCommand, LosesNothingBetweenARunThatSawNoEventAndTheNext) {
+    const ScriptedService service{
+        {newest(0), waiting, newest(3), awaited(), answering(eventBatch({1, 2, 3}))}};
+    Program first{raidinfo({"events", "--state", "events.state"})};
+    EXPECT_EQ(interrupt(first, service, 1).output, "");
+    const Result result = run({"events", "--json", "--count", "3", "--state", "events.state"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(1, 2, 3));
+    EXPECT_EQ(result.errors, "");
+    std::remove("events.state");
+}
+
+TEST(EventsCommand, GivesUpOnAServiceThatIsSilentFromTheStart) {
+    const ScriptedService service{{waiting}};
+    const Result result = run({"events", "--timeout", "1"});
+    EXPECT_EQ(result.status, 69);
+    EXPECT_THAT(result.errors, HasSubstr("--timeout"));
+}
+
+// Some supervisors leave the signal ignored, and children inherit that.
+TEST(EventsCommand, LearnsThatTheProgramFailedAlsoWhereTheEndOfChildrenIsIgnored) {
+    const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5}))}};
+    Program program{{"/bin/sh", "-c", "trap '' CHLD; exec \"$0\" events --count 1 --exec 'exit 3'",
+                     RAIDINFO_PROGRAM}};
+    EXPECT_THAT(program.finish().errors, HasSubstr("ended with status 3"));
+}
+
 TEST(EventsCommand, HandsEachEventToAProgram) {
     const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5, 6}))}};
     const Result result = run({"events", "--count", "2", "--exec", "cat >>hook.out"});

@@ -82,6 +82,33 @@ TEST(FailingProgram, GivesUpOnASilentServiceAfterTheTimeout) {
     expectFailure(run({"list", "--timeout", "1"}), 69, "--timeout");
 }
 
+TEST(FailingProgram, CallsASilentServiceSilentInAVerdict) {
+    const ScriptedService service{{Connection{.end = End::hold}}};
+    const Result result = run({"health", "--timeout", "1"});
+    EXPECT_EQ(result.status, 3);
+    EXPECT_THAT(result.output, HasSubstr("UNKNOWN: the RAID management service gave no answer"));
+}
+
+// Too little address space for the buffer of texts.
+TEST(FailingProgram, TellsOfWhatItLacksInTheFormThatWasAskedFor) {
+    const auto inLittleSpace = [](const std::string& arguments) {
+        const ScriptedService service{{answering(configuration(sampleAdapter()))}};
+        return Program{
+            {"/bin/sh", "-c", "ulimit -v 600000; exec \"$0\" " + arguments, RAIDINFO_PROGRAM}}
+            .finish();
+    };
+    const Result monitored = inLittleSpace("health --nagios");
+    EXPECT_EQ(monitored.status, 3);
+    EXPECT_THAT(monitored.output, MatchesRegex("RAID UNKNOWN - [^\n]*\n"));
+    const Result listed = inLittleSpace("list --json");
+    EXPECT_EQ(listed.status, 70);
+    EXPECT_EQ(json::parse(listed.output)["errors"][0]["code"], "internal_error");
+}
+
+TEST(FailingProgram, DoesNotReadAFileWithoutEnd) {
+    expectFailure(run({"tree", "--from", "/dev/zero"}), 65, "longer than");
+}
+
 TEST(FailingProgram, GivesUpOnAServiceThatAcceptsNoConnection) {
     const BusyService service;
     expectFailure(run({"list", "--timeout", "1"}), 69, "--timeout");
@@ -130,9 +157,13 @@ TEST(FailingProgram, RefusesAWrongFilterBeforeItAsksTheService) {
     expectFailure(run({"list", "--filter", "overall_status=Bogus"}), 64, "Critical or unknown");
 }
 
-// A monitoring system learns from 64 that nobody has looked at the machine.
+// A monitoring system takes any other status for that of a plugin that is broken.
 TEST(FailingProgram, RefusesAWrongCommandLineAlsoWhereItHasStatusesOfItsOwn) {
-    expectFailure(run({"health", "--nagios", "--bogus"}), 64, "--bogus");
+    const Result result = run({"health", "--nagios", "--bogus"});
+    EXPECT_EQ(result.status, 3);
+    EXPECT_THAT(result.output, MatchesRegex("RAID UNKNOWN - [^\n]*--bogus[^\n]*\n"));
+    EXPECT_THAT(result.errors, HasSubstr("--bogus"));
+    expectFailure(run({"health", "--bogus"}), 64, "--bogus");
     expectFailure(run({"diff"}), 64, "before");
 }
 

@@ -66,7 +66,7 @@ TEST(ListCommand, WritesEveryFieldAsJson) {
         "write_cache_enable": 0, "write_cache_enable_supported": false})"));
 }
 
-TEST(ListCommand, ShowsAnUnknownStatusAsNull) {
+TEST(ListCommand, ShowsAnUnknownAsNull) {
     const std::string adapter =
         complex("adapter", "o:LSIAdapter", simple({{"overallStatus", "3"}}));
     const json lists = dataOf(runWith(configuration(adapter), {"list", "--json"}));

@@ -4,9 +4,11 @@
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <sstream>
+#include <string>
 #include <vector>
 
 #include "program.h"
+#include "simulator.h"
 
 namespace raidinfo::test {
 namespace {
@@ -69,6 +71,47 @@ TEST(EventsThroughAStorm, AreAllShownOnceWhileTheServiceIsKilledAndRestartedThre
         wanted[static_cast<std::size_t>(number)] = number + 1;
     }
     EXPECT_EQ(numbers, wanted);
+}
+
+void raise(Simulator& service, const std::string& name, int count) {
+    for (int number = 1; number <= count; ++number) {
+        service.command("event string=" + name + std::to_string(number));
+    }
+}
+
+TEST(EventsThroughARestart, AreShownOnceWhenTheServiceThenHasOtherEventsAndMoreThanItTellsAtOnce) {
+    constexpr int before = 107;
+    constexpr int after = 300;
+    std::optional<Simulator> service{"small-server.xml"};
+    raise(*service, "E", before);
+    const std::string count = std::to_string(before + after);
+    Program follower{raidinfo({"events", "--since", "1", "--count", count, "--json"})};
+    follower.waitForOutput("\"E107\"");
+    service.reset();
+    follower.waitForOutput("service_unavailable");
+    service.emplace("small-server.xml");
+    raise(*service, "F", after);
+    const Result result = follower.finish();
+    std::vector<std::string> told;
+    int restarts = 0;
+    std::istringstream lines{result.output};
+    for (std::string line; std::getline(lines, line);) {
+        const json document = json::parse(line);
+        if (document["data"].is_object()) {
+            told.push_back(document["data"]["message_string"]);
+        } else {
+            restarts += document["errors"][0]["code"] == "numbers_went_back" ? 1 : 0;
+        }
+    }
+    std::vector<std::string> wanted;
+    for (int number = 1; number <= before; ++number) {
+        wanted.push_back("E" + std::to_string(number));
+    }
+    for (int number = 1; number <= after; ++number) {
+        wanted.push_back("F" + std::to_string(number));
+    }
+    EXPECT_EQ(told, wanted);
+    EXPECT_EQ(restarts, 1);
 }
 
 }  // namespace

@@ -7,7 +7,9 @@
 #include <utility>
 #include <vector>
 
+#include "documents.h"
 #include "program.h"
+#include "scripted.h"
 #include "simulator.h"
 
 namespace raidinfo::test {
@@ -48,6 +50,22 @@ TEST(WatchCommand, NoticesWhatHappensWithoutAnEvent) {
     watch.waitForOutput("* │  ├─ Disk drive 3: Critical");
     watch.signal(SIGINT);
     EXPECT_EQ(watch.finish().status, 130);
+}
+
+// The wait for an event after 4 ends at once, for there is 50.
+TEST(WatchCommand, IsNotKeptBusyByNumbersInDisorder) {
+    const Connection configured = answering(configuration(sampleAdapter()));
+    const Connection four = answering(newestEventDocument("4"));
+    const Connection awaited = answering("the answer to the wait is not looked at");
+    const Connection events = answering(eventBatch({50, 4}));
+    const ScriptedService service{{four, configured, awaited, events, four, configured, awaited,
+                                   events, four, configured, awaited, events}};
+    Program watch{raidinfo({"watch", "--interval", "3600", "--json"})};
+    service.waitFor(11, Stage::answered);
+    watch.signal(SIGINT);
+    const Result result = watch.finish();
+    EXPECT_EQ(result.status, 130);
+    EXPECT_THAT(result.output, Not(HasSubstr("service_unavailable"))) << "it has asked again";
 }
 
 TEST(WatchCommand, WritesADocumentForEachChange) {

@@ -11,13 +11,17 @@ namespace {
 
 constexpr int defaultLimitSeconds = 60;
 
-constexpr auto footer =
-    "The options stand before or behind the subcommand.\n"
-    "Exit status: 0 done, 64 wrong usage, 65 a file is wrong, 66 a file cannot be read,\n"
-    "69 the service does not answer, 70 internal error, 72 the library cannot be used,\n"
-    "73 a file cannot be written, 74 the output cannot be written, 76 malformed answer,\n"
-    "130 interrupted. health: 0 ok, 1 warning, 2 critical, 3 unknown. diff: 0 same, 1 different,\n"
-    "2 trouble.";
+std::string footer() {
+    std::string text =
+        "The options stand before or behind the subcommand.\n\nExit status:\n"
+        "  0, 1, 2, 3  health: ok, warning, critical, unknown\n"
+        "  0, 1, 2     diff: the same, different, trouble\n";
+    for (const auto& [status, code, meaning] : statusWords) {
+        const std::string number = std::to_string(static_cast<int>(status));
+        text += "  " + number + std::string(12 - number.size(), ' ') + std::string{meaning} + "\n";
+    }
+    return text + "  130         interrupted; 128 and its number for any other signal";
+}
 
 constexpr auto colors = std::to_array<std::pair<const char*, ColorChoice>>({
     {"auto", ColorChoice::automatic},
@@ -39,7 +43,7 @@ ColorChoice colorNamed(const std::string& word) {
 Description::Description()
     : parser{std::make_unique<CLI::App>(
           "Shows the RAID configuration and the RAID events of this machine.", "raidinfo")} {
-    parser->footer(footer);
+    parser->footer(footer());
     parser->require_subcommand(1);
     parser->fallthrough();
     parser->set_version_flag("--version", RAIDINFO_VERSION);
@@ -71,12 +75,16 @@ Options Description::options() const {
                     .color = colorNamed(words.color),
                     .library = optionalPath(words.library),
                     .recording = optionalPath(words.recording),
-                    .codes = optionalPath(words.codes)};
+                    .codes = optionalPath(words.codes),
+                    .limit = limitOf(words)};
     for (const Subcommand& subcommand : allSubcommands()) {
         const CLI::App* const app = parser->get_subcommand(subcommand.name);
         if (app->parsed()) {
+            if (subcommand.withoutRecording != nullptr && options.recording) {
+                throw Failure{ExitStatus::usage, subcommand.withoutRecording};
+            }
             options.command = subcommand.read(*app, words);
-            options.limit = subcommand.limited ? limitOf(words) : std::nullopt;
+            options.limited = subcommand.limited;
         }
     }
     return options;

@@ -47,7 +47,6 @@ struct WatchOptions {
 struct HealthOptions {
     bool explain = false;
     bool nagios = false;
-    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< for the service's answer
     std::optional<Path> policy = std::nullopt;
 };
 
@@ -66,9 +65,7 @@ struct RecordOptions {
     std::optional<std::chrono::seconds> duration = std::nullopt;
 };
 
-struct DoctorOptions {
-    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< for the service's answer
-};
+struct DoctorOptions {};
 struct CompletionOptions {};
 struct SchemaOptions {};
 
@@ -77,6 +74,10 @@ using CommandOptions = std::variant<ListOptions, ShowOptions, TreeOptions, Event
                                     WatchOptions, HealthOptions, SnapshotOptions, DiffOptions,
                                     RecordOptions, DoctorOptions, CompletionOptions, SchemaOptions>;
 
+/// What ends when the time that --timeout gives is over: the wait for the first answer where the
+/// subcommand has something to say or to do besides, else the program.
+enum class Limited : std::uint8_t { answer, program };
+
 struct Options {
     CommandOptions command = {};
     bool json = false;
@@ -84,7 +85,12 @@ struct Options {
     std::optional<Path> library = std::nullopt;
     std::optional<Path> recording = std::nullopt;  ///< to read instead of the service
     std::optional<Path> codes = std::nullopt;
-    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< none for what follows
+    Limited limited = Limited::program;
+    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< none: without end
+
+    [[nodiscard]] std::optional<std::chrono::milliseconds> limitOf(Limited what) const {
+        return limited == what ? limit : std::nullopt;
+    }
 };
 
 /// A text that was asked for instead of a command: help or the version.

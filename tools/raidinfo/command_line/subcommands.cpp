@@ -113,7 +113,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
                               optionalNumber(app, "--count", words.count), words.command,
                               optionalPath(words.state)};
      },
-     false},
+     Limited::answer},
     {"watch", "Show the tree again whenever something happens",
      "What changed is marked with \"*\". Ctrl-C ends it.\n"
      "Example: raidinfo watch --interval 10",
@@ -125,7 +125,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      [](const CLI::App&, const Words& words) -> CommandOptions {
          return WatchOptions{std::chrono::seconds{words.interval}};
      },
-     false},
+     Limited::answer, "a recording does not change; watch needs the service"},
     {"health", "Say in one word how the machine's RAID is",
      "Exit status: 0 ok, 1 warning, 2 critical, 3 unknown.\n"
      "Examples:\n"
@@ -141,10 +141,9 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          if (words.nagios && (words.explain || words.json)) {
              throw Failure{ExitStatus::usage, "--nagios goes neither with --explain nor --json"};
          }
-         return HealthOptions{words.explain, words.nagios, limitOf(words),
-                              optionalPath(words.policy)};
+         return HealthOptions{words.explain, words.nagios, optionalPath(words.policy)};
      },
-     false},
+     Limited::answer},
     {"snapshot", "Save the inventory to compare it later", "Example: raidinfo snapshot before.json",
      [](CLI::App& app, Words& words) {
          addFileOperand(app, "file", words.file, "The file to write; - prints it")->required();
@@ -165,6 +164,9 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          addFileOperand(app, "after", words.after, "The later one");
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {
+         if (!words.after.empty() && !words.recording.empty()) {
+             throw Failure{ExitStatus::usage, "--from takes the place of AFTER"};
+         }
          return DiffOptions{words.before, words.after};
      }},
     {"record", "Save the service's answers until interrupted",
@@ -186,13 +188,11 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          }
          return record;
      },
-     false},
+     Limited::answer, "record saves what the service answers, not a recording"},
     {"doctor", "Say what is wrong when nothing shows", "Example: raidinfo doctor",
      [](CLI::App&, Words&) {},
-     [](const CLI::App&, const Words& words) -> CommandOptions {
-         return DoctorOptions{limitOf(words)};
-     },
-     false},
+     [](const CLI::App&, const Words&) -> CommandOptions { return DoctorOptions{}; },
+     Limited::answer, "doctor examines the service, not a recording"},
     {"completion", "Print the completion for bash",
      "Example: raidinfo completion > /etc/bash_completion.d/raidinfo", [](CLI::App&, Words&) {},
      [](const CLI::App&, const Words&) -> CommandOptions { return CompletionOptions{}; }},

@@ -14,7 +14,8 @@ struct Subcommand {
     const char* examples;
     void (*declare)(CLI::App&, Words&);
     CommandOptions (*read)(const CLI::App&, const Words&);
-    bool limited = true;  ///< --timeout counts
+    Limited limited = Limited::program;
+    const char* withoutRecording = nullptr;  ///< why --from is refused, where it is
 };
 
 /// In the order of CommandOptions.

@@ -1,5 +1,6 @@
 #include <nlohmann/json.hpp>
 #include <string>
+#include <vector>
 
 #include "commands/commands.h"
 #include "doctor/examination.h"
@@ -39,15 +40,15 @@ Json entry(const Examined& found) {
 
 }  // namespace
 
-int runCommand(const Session& session, const DoctorOptions& doctor) {
-    if (session.recorded()) {
-        throw Failure{ExitStatus::usage, "doctor examines the service, not a recording"};
-    }
+int runCommand(const Session& session, const DoctorOptions& /*doctor*/) {
     auto status = ExitStatus::ok;
+    std::vector<Trouble> troubles;
     auto findings = Json::array();
-    examine(session.library(), doctor.limit, [&](const Examined& found) {
+    const auto limit = session.options().limitOf(Limited::answer);
+    examine(session.library(), limit, [&](const Examined& found) {
         if (found.outcome == Examined::Outcome::bad) {
             status = found.status;
+            troubles.push_back({troubleCode(status), found.finding});
         }
         if (session.options().json) {
             findings.push_back(entry(found));
@@ -56,7 +57,7 @@ int runCommand(const Session& session, const DoctorOptions& doctor) {
         }
     });
     if (session.options().json) {
-        session.print(Json::object({{"findings", std::move(findings)}}));
+        session.print(Json::object({{"findings", std::move(findings)}}), troubles);
     }
     return static_cast<int>(status);
 }

@@ -1,3 +1,5 @@
+#include <algorithm>
+#include <chrono>
 #include <cstdint>
 #include <nlohmann/json.hpp>
 #include <optional>
@@ -49,6 +51,13 @@ public:
         }
     }
 
+    /// A run that is ended before it has shown anything must not lose what comes until the next.
+    void begin(std::int64_t first) {
+        if (options.state) {
+            StateFile{*options.state}.write({std::max<std::int64_t>(first - 1, 0)});
+        }
+    }
+
 private:
     /// An event that comes late leaves the state alone.
     void keep(const Record& event) {
@@ -75,8 +84,9 @@ private:
 };
 
 /// What cannot be kept is told before the first event is handed to anybody.
-StreamStart startOf(const EventsOptions& options) {
-    StreamStart start{.first = options.since};
+StreamStart startOf(const EventsOptions& options,
+                    std::optional<std::chrono::milliseconds> patience) {
+    StreamStart start{.first = options.since, .patience = patience};
     if (options.state) {
         const StateFile state{*options.state};
         start.shownBefore = state.read();
@@ -112,11 +122,12 @@ void showRecorded(const Session& session, const StreamStart& start, const EventL
 }  // namespace
 
 int runCommand(const Session& session, const EventsOptions& events) {
-    const StreamStart start = startOf(events);
+    const StreamStart start = startOf(events, session.options().limitOf(Limited::answer));
     Presentation presentation{session, events, start.shownBefore};
     const EventListener listener{
         [&presentation](const Record& event) { return presentation.show(event); },
-        [&presentation](const Notice& notice) { presentation.notice(notice); }};
+        [&presentation](const Notice& notice) { presentation.notice(notice); },
+        [&presentation](std::int64_t first) { presentation.begin(first); }};
     if (session.recorded()) {
         showRecorded(session, start, listener);
     } else {

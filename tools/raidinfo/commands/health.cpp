@@ -1,4 +1,5 @@
 #include <optional>
+#include <stop_token>
 
 #include "commands/commands.h"
 #include "exit_status.h"
@@ -7,6 +8,7 @@
 #include "health/nagios.h"
 #include "health/policy.h"
 #include "health/report.h"
+#include "source/service_failures.h"
 #include "system/alarm.h"
 
 namespace raidinfo {
@@ -23,15 +25,17 @@ health::Verdict verdictOf(const Session& session, const HealthOptions& options,
     const health::Policy policy =
         options.policy ? health::readPolicy(*options.policy, book) : health::defaultPolicy(book);
     std::optional<Alarm> alarm;
-    if (options.limit) {
-        alarm.emplace(*options.limit, session.library().function<void()>("cancelGetEvent"));
+    if (const auto limit = session.options().limitOf(Limited::answer)) {
+        alarm.emplace(*limit, session.library().function<void()>("cancelGetEvent"));
     }
+    const std::stop_token over = alarm ? alarm->over() : session.stop();
     try {
-        return health::judge(session.inventory().adapters(), policy, book);
-    } catch (const Failure& failure) {
-        if (!isUnknownState(failure)) {
+        return health::judge(session.inventory(over).adapters(), policy, book);
+    } catch (const Failure& thrown) {
+        if (!isUnknownState(thrown)) {
             throw;
         }
+        const Failure failure = over.stop_requested() ? noAnswerInTime() : thrown;
         troubles.push_back({troubleCode(failure.status()), failure.what()});
         return health::unknownBecause(failure.what());
     }

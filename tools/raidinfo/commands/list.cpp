@@ -86,7 +86,7 @@ int runCommand(const Session& session, const ListOptions& list) {
         } else if (list.headings) {
             text += (text.empty() ? "" : "\n") + titledTable(listing, layout, session.codeBook());
         } else if (!listing.rows.empty()) {
-            text += table(listing, layout, session.codeBook());
+            text += namedTable(listing, layout, session.codeBook());
         }
     }
     if (json) {

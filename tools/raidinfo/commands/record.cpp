@@ -3,7 +3,6 @@
 #include <string>
 
 #include "commands/commands.h"
-#include "exit_status.h"
 #include "redact/redactor.h"
 #include "source/recorder.h"
 #include "system/file.h"
@@ -12,9 +11,6 @@
 namespace raidinfo {
 
 int runCommand(const Session& session, const RecordOptions& record) {
-    if (session.recorded()) {
-        throw Failure{ExitStatus::usage, "record saves what the service answers, not a recording"};
-    }
     const std::string startedAt = presentTimestamp();
     const bool toOutput = isStandardOutput(record.file);
     std::optional<GrowingFile> file;  // from the first answer on: a recording that is there is kept
@@ -48,7 +44,8 @@ int runCommand(const Session& session, const RecordOptions& record) {
         }
         file->append(text);
     };
-    recordAnswers(session.library(), sink, record.duration, session.stop());
+    recordAnswers(session.library(), sink,
+                  {record.duration, session.options().limitOf(Limited::answer)}, session.stop());
     if (session.options().json && !toOutput) {
         session.print(Json::object({{"file", record.file.string()}, {"answers", answers}}));
     }

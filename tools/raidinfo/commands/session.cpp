@@ -35,8 +35,8 @@ Session::Session(const Options& given, const Library& loaded, const Output& dest
 
 GridLayout Session::layout() const { return {.width = screen.width, .painter = painter()}; }
 
-Trees Session::inventory() const {
-    return Trees{answers ? recordedInventory(lib, *answers) : readInventory(lib, stopToken)};
+Trees Session::inventory(const std::stop_token& stop) const {
+    return Trees{answers ? recordedInventory(lib, *answers) : readInventory(lib, stop)};
 }
 
 const CodeBook& Session::codeBook() const {

@@ -54,7 +54,10 @@ public:
     }
 
     /// Of the service, or of the recording.
-    [[nodiscard]] Trees inventory() const;
+    [[nodiscard]] Trees inventory() const { return inventory(stopToken); }
+
+    /// The same, which means nothing once stop is requested.
+    [[nodiscard]] Trees inventory(const std::stop_token& stop) const;
 
     /// What the service's numbers mean.
     [[nodiscard]] const CodeBook& codeBook() const;

@@ -1,3 +1,6 @@
+#include <algorithm>
+#include <cstdint>
+#include <limits>
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <string>
@@ -5,6 +8,7 @@
 
 #include "commands/commands.h"
 #include "events/event_line.h"
+#include "events/follower.h"
 #include "exit_status.h"
 #include "json/json.h"
 #include "source/service_failures.h"
@@ -45,20 +49,25 @@ public:
 private:
     /// Reads and shows the inventory; what is shown stays where the service does not answer.
     bool look() {
+        std::optional<Alarm> alarm;
+        if (const auto limit = session.options().limitOf(Limited::answer); limit && !everShown) {
+            alarm.emplace(*limit, session.library().function<void()>("cancelGetEvent"));
+        }
+        const std::stop_token over = alarm ? alarm->over() : session.stop();
         if (askNewest() == 0) {
-            return lost(serviceUnavailable());
+            return lost(over.stop_requested() ? noAnswerInTime() : serviceUnavailable());
         }
         const int seen = *newest;
         try {
-            const Trees trees = session.inventory();
+            const Trees trees = session.inventory(over);
             if (session.stop().stop_requested()) {
                 return true;
             }
-            lastNumber = seen;
+            newestSeen = seen;
             show(trees);
             return true;
         } catch (const Failure& failure) {
-            return lost(failure);
+            return lost(over.stop_requested() ? noAnswerInTime() : failure);
         }
     }
 
@@ -110,22 +119,46 @@ private:
 
     /// Until something happens or the interval is over.
     void waitForEvents() {
-        session.library().function<void(int)>("setRAIDEventSequenceNumber")(lastNumber + 1);
-        const Alarm alarm{options.interval, session.library().function<void()>("cancelGetEvent")};
-        session.library().function<int()>("getEvent")();
-        constexpr std::size_t shownEvents = 3;
-        for (const Record& event : reader.read(eventKind())) {
-            if (numberOf(eventKind(), event, "sequence_number") > lastNumber) {
-                std::string line = eventLine(event);
-                line.pop_back();
-                lastEvents.push_back({std::move(line)});
-            }
+        const std::int64_t next = std::min<std::int64_t>(newestSeen + 1, largestNumber);
+        session.library().function<void(int)>("setRAIDEventSequenceNumber")(static_cast<int>(next));
+        bool inTime = false;
+        {
+            const Alarm alarm{options.interval,
+                              session.library().function<void()>("cancelGetEvent")};
+            session.library().function<int()>("getEvent")();
+            inTime = !alarm.over().stop_requested();
         }
+        const bool isNew = tellEvents(reader.read(eventKind()));
+        // A service whose newest event has a lower number than others, or that fails, ends each
+        // wait at once.
+        idleWaits = inTime && !isNew ? idleWaits + 1 : 0;
+        if (idleWaits > 1) {
+            pauseUnlessStopped(options.interval, session.stop());
+        }
+    }
+
+    /// Keeps the last ones for the picture; returns whether there were any.
+    bool tellEvents(const Records& batch) {
+        if (!continuity) {
+            continuity.emplace(newestSeen + 1);
+        }
+        const bool wentBack = continuity->last() && newestSeen < *continuity->last();
+        static_cast<void>(beginsAnew(*continuity, batch, wentBack, silent));
+        const auto fresh = continuity->accept(batch).fresh;
+        for (const std::size_t place : fresh) {
+            std::string line = eventLine(batch[place]);
+            line.pop_back();
+            lastEvents.push_back({std::move(line)});
+        }
+        constexpr std::size_t shownEvents = 3;
         if (lastEvents.size() > shownEvents) {
             lastEvents.erase(lastEvents.begin(),
                              lastEvents.end() - static_cast<std::ptrdiff_t>(shownEvents));
         }
+        return !fresh.empty();
     }
+
+    static constexpr std::int64_t largestNumber = std::numeric_limits<int>::max();
 
     const Session& session;
     const WatchOptions& options;
@@ -137,16 +170,17 @@ private:
     std::vector<TreeLine> lines;
     std::vector<ScreenLine> lastEvents;
     std::string trouble;
-    int lastNumber = 0;
+    std::optional<Continuity> continuity;  ///< of the events, from the first wait on
+    EventListener silent{[](const Record& /*event*/) { return true; },
+                         [](const Notice& /*notice*/) {}};
+    std::int64_t newestSeen = 0;  ///< before the last look
+    int idleWaits = 0;            ///< that ended early and brought nothing, in a row
     bool everShown = false;
 };
 
 }  // namespace
 
 int runCommand(const Session& session, const WatchOptions& watch) {
-    if (session.recorded()) {
-        throw Failure{ExitStatus::usage, "a recording does not change; watch needs the service"};
-    }
     Watch{session, watch}.run();
     return 0;
 }

@@ -22,7 +22,7 @@ bool isNumberOfTheService(const Json& json) {
 /// None for what no record of the library can hold.
 std::optional<Value> fromJson(const Json& json) {
     if (json.is_null()) {
-        return UnknownStatus{};
+        return Unknown{};
     }
     if (json.is_boolean()) {
         return json.get<bool>();

@@ -10,6 +10,8 @@
 #include <array>
 #include <cerrno>
 #include <filesystem>
+#include <optional>
+#include <stop_token>
 #include <system_error>
 #include <utility>
 
@@ -29,13 +31,14 @@ using Limit = std::optional<std::chrono::milliseconds>;
 
 constexpr int bitsOfAByte = 8;
 
-/// A file that the library looks for beside the working directory.
-std::string placeOf(const fs::path& name) {
+/// Where the library looks for a file beside the working directory; nowhere if that is gone.
+std::optional<fs::path> placeOf(const fs::path& name) {
     std::error_code unknown;
     const fs::path here = fs::current_path(unknown);
-    return unknown ? "nowhere: the working directory is gone"
-                   : (here / "../logs" / name).lexically_normal().string();
+    return unknown ? std::nullopt : std::optional{(here / "../logs" / name).lexically_normal()};
 }
+
+constexpr auto nowhere = "nowhere, for the working directory is gone";
 
 Examined loadedFile(const Library& library) {
     Dl_info information{};
@@ -50,21 +53,28 @@ Examined loadedFile(const Library& library) {
 
 Examined settings(const Library& library) {
     const int level = *library.variable<int>("LOG_LEVEL");
-    const std::string place = placeOf("RAIDInstrumentation.ini");
+    const auto place = placeOf("RAIDInstrumentation.ini");
     std::error_code unknown;
-    const bool there = fs::exists(place, unknown);
+    const bool isMissing = place && !fs::exists(*place, unknown);
     return {"settings", "Settings file", Outcome::fine,
-            place + (there ? "" : ", which is not there") + "; log level " + std::to_string(level)};
+            (place ? place->string() : nowhere) + (isMissing ? ", which is not there" : "") +
+                "; log level " + std::to_string(level)};
 }
 
 Examined log(const Library& library) {
-    const fs::path place = placeOf("RAIDInstrumentation.log");
-    const bool off = *library.variable<int>("LOG_LEVEL") == 0;
-    const bool writable = access(place.parent_path().c_str(), W_OK) == 0;
-    return {
-        "log", "Log file", off || writable ? Outcome::fine : Outcome::noteworthy,
-        place.string() + (off ? ", which is off"
-                              : (writable ? "" : ": " + std::generic_category().message(errno)))};
+    const auto place = placeOf("RAIDInstrumentation.log");
+    if (*library.variable<int>("LOG_LEVEL") == 0) {
+        return {"log", "Log file", Outcome::fine,
+                (place ? place->string() : nowhere) + std::string{", which is off"}};
+    }
+    if (!place) {
+        return {"log", "Log file", Outcome::noteworthy, nowhere};
+    }
+    std::error_code unknown;
+    const fs::path written = fs::exists(*place, unknown) ? *place : place->parent_path();
+    const bool writable = access(written.c_str(), W_OK) == 0;
+    return {"log", "Log file", writable ? Outcome::fine : Outcome::noteworthy,
+            place->string() + (writable ? "" : ": " + std::generic_category().message(errno))};
 }
 
 /// Waits for the connection that the socket has begun; returns what went wrong, or 0.
@@ -112,11 +122,15 @@ Examined answering(const Library& library) {
             "its newest event is " + std::to_string(newest)};
 }
 
-Examined wellFormed(const Library& library) {
+Examined wellFormed(const Library& library, const std::stop_token& over) {
     const LibraryLog log{library};
     library.function<int()>("RAIDinit")();
     if (*library.variable<const void*>("raidSystem") != nullptr) {
         return {"well_formed", "Configuration", Outcome::fine, "well-formed"};
+    }
+    if (over.stop_requested()) {
+        return {"well_formed", "Configuration", Outcome::bad,
+                "it gave no answer within the --timeout", ExitStatus::serviceUnavailable};
     }
     const std::string message = log.lastError();
     return {"well_formed", "Configuration", Outcome::bad,
@@ -157,18 +171,19 @@ void examine(const Library& library, std::optional<std::chrono::milliseconds> li
     const Examined service = listening(limit);
     const auto passed = std::chrono::floor<std::chrono::milliseconds>(Clock::now() - begun);
     if (limit && passed >= *limit) {
-        tell(service);  // nothing ends the library's own wait for a connection
+        tell(service);
         return;
     }
     std::optional<Alarm> alarm;
     if (limit) {
         alarm.emplace(*limit - passed, library.function<void()>("cancelGetEvent"));
     }
+    const std::stop_token over = alarm ? alarm->over() : std::stop_token{};
     // The library reads its settings with the first exchange.
     const Examined answer = answering(library);
     tell(settings(library));
     tell(log(library));
-    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library))) {
+    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library, over))) {
         return;
     }
     tell(published(library));

@@ -52,6 +52,9 @@ std::uint64_t contentOf(const Record& event) {
 }
 
 Continuity Continuity::after(const LastShown& last) {
+    if (last.number == 0) {
+        return Continuity{0};  // There was no event yet, and nobody knows the number of the first.
+    }
     Continuity continuity{last.number + 1};
     continuity.greatest = last.number;
     if (last.content) {
@@ -72,8 +75,11 @@ Continuity::Accepted Continuity::accept(const Records& batch) {
         if (number >= expected) {
             ahead.insert(number);
         }
-        if (isFresh(number, content)) {
+        const bool fresh = isFresh(number, content);
+        if (fresh) {
             accepted.fresh.push_back(place);
+        }
+        if (fresh || shown.contains({number, content})) {
             remember(number, content);
         }
     }
@@ -95,16 +101,23 @@ Continuity::Accepted Continuity::accept(const Records& batch) {
     return accepted;
 }
 
+/// What was shown before the service began to count anew says nothing of the events that it has
+/// now.
 Continuity::History Continuity::compared(const Records& batch) const {
     History history = History::unknown;
     for (const Record& event : batch) {
-        const auto found = shown.find(numberOf(event));
-        if (found != shown.end()) {
-            if (found->second != contentOf(event)) {
-                return History::different;
-            }
-            history = History::same;
+        const Event looked{numberOf(event), contentOf(event)};
+        bool isNumberKnown = false;
+        bool isKnown = false;
+        for (auto known = shown.lower_bound({looked.first, 0});
+             known != shown.end() && known->first.first == looked.first; ++known) {
+            isNumberKnown |= known->second == count;
+            isKnown |= known->second == count && known->first == looked;
         }
+        if (isNumberKnown && !isKnown) {
+            return History::different;
+        }
+        history = isKnown ? History::same : history;
     }
     return history;
 }
@@ -114,6 +127,7 @@ void Continuity::beginAnew() {
     asked = 0;
     greatest.reset();
     missingUntil.clear();
+    ++count;
 }
 
 void Continuity::shrinkTo(std::int64_t number) {
@@ -134,9 +148,9 @@ std::int64_t Continuity::overlapping() const {
 
 /// An event with the number of another one that was shown is new when it says something else.
 bool Continuity::isFresh(std::int64_t number, std::uint64_t content) {
-    const auto found = shown.find(number);
-    if (found != shown.end()) {
-        return found->second != content;
+    const auto known = shown.lower_bound({number, 0});
+    if (known != shown.end() && known->first.first == number) {
+        return !shown.contains({number, content});
     }
     return number >= expected || takeFromMissing(number);
 }
@@ -158,8 +172,9 @@ bool Continuity::takeFromMissing(std::int64_t number) {
 }
 
 void Continuity::remember(std::int64_t number, std::uint64_t content) {
-    if (shown.insert_or_assign(number, content).second) {
-        order.push_back(number);
+    const Event event{number, content};
+    if (shown.insert_or_assign(event, count).second) {
+        order.push_back(event);
     }
     if (order.size() > memory) {
         shown.erase(order.front());

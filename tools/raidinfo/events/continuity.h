@@ -5,6 +5,7 @@
 #include <deque>
 #include <map>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include "inventory/records.h"
@@ -76,12 +77,16 @@ private:
     [[nodiscard]] bool takeFromMissing(std::int64_t number);
     void remember(std::int64_t number, std::uint64_t content);
 
+    /// An event by its number and content; the service may use a number twice.
+    using Event = std::pair<std::int64_t, std::uint64_t>;
+
     std::int64_t expected;   ///< the least number that is ahead
     std::int64_t asked = 0;  ///< numbers below were asked for in vain
     std::optional<std::int64_t> greatest;
     std::map<std::int64_t, std::int64_t> missingUntil;  ///< last missing by first missing
-    std::map<std::int64_t, std::uint64_t> shown;        ///< content by number
-    std::deque<std::int64_t> order;                     ///< of `shown`, oldest first
+    std::map<Event, int> shown;  ///< and in which of the service's counts it was seen last
+    std::deque<Event> order;     ///< of `shown`, oldest first
+    int count = 0;               ///< of the times that the service began to count
 };
 
 }  // namespace raidinfo

@@ -1,11 +1,13 @@
 #include "events/follower.h"
 
 #include <algorithm>
+#include <chrono>
 #include <limits>
 #include <optional>
 #include <string>
 
 #include "source/service_failures.h"
+#include "system/alarm.h"
 #include "system/backoff.h"
 
 namespace raidinfo {
@@ -13,6 +15,8 @@ namespace {
 
 /// An answering service whose events could not be read this often in a row sends malformed ones.
 constexpr int malformedReads = 5;
+
+constexpr std::chrono::milliseconds pauseOfRestart{200};
 
 std::string told(const MissingNumbers& missing) {
     return missing.first == missing.last ? "event " + std::to_string(missing.first) + " is missing"
@@ -28,6 +32,7 @@ public:
           nextNumber{library.variable<int>("nextSequenceNumber")},
           setNext{library.function<void(int)>("setRAIDEventSequenceNumber")},
           waitForEvents{library.function<int()>("getEvent")},
+          cancel{library.function<void()>("cancelGetEvent")},
           batch{library.variable<const void*>("raidEvents")},
           listener{told},
           beginning{start} {}
@@ -45,7 +50,7 @@ public:
         mayBeLate = false;
         const Records records = readFrom(from, stop);
         if (stop.stop_requested() ||
-            (last && from <= *last && !isContinued(records, wentBack, *last))) {
+            (last && from <= *last && !isContinued(records, wentBack, *last, stop))) {
             return true;
         }
         return show(records, from, stop);
@@ -54,7 +59,7 @@ public:
 private:
     /// Before each wait: a service that was restarted would let a wait for the old numbers hang.
     bool isServiceThere(const std::stop_token& stop) {
-        if (askNewest() == 0) {
+        if (!isAnswering()) {
             if (!stop.stop_requested()) {
                 waitForService(stop);
             }
@@ -73,6 +78,19 @@ private:
         return true;
     }
 
+    /// Only the first answer is a matter of patience: later a silent service is waited for.
+    [[nodiscard]] bool isAnswering() const {
+        std::optional<Alarm> alarm;
+        if (!continuity && beginning.patience) {
+            alarm.emplace(*beginning.patience, cancel);
+        }
+        const bool answers = askNewest() != 0;
+        if (!answers && alarm && alarm->over().stop_requested()) {
+            throw noAnswerInTime();
+        }
+        return answers;
+    }
+
     void begin() {
         if (beginning.shownBefore) {
             continuity = Continuity::after(*beginning.shownBefore);
@@ -80,6 +98,7 @@ private:
         }
         const std::int64_t first = beginning.first.value_or(newest);
         continuity = Continuity{first};
+        listener.begin(first);
         if (first > newest) {
             listener.notice({"waiting_for_event", "the newest event is " + std::to_string(newest) +
                                                       "; waiting for event " +
@@ -110,8 +129,11 @@ private:
 
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to
     /// count anew, and what it has is asked for from the beginning.
-    bool isContinued(const Records& records, bool wentBack, std::int64_t last) {
+    bool isContinued(const Records& records, bool wentBack, std::int64_t last,
+                     const std::stop_token& stop) {
         if (beginsAnew(*continuity, records, wentBack, listener)) {
+            // One that says something else each time must not keep this program busy.
+            pauseUnlessStopped(pauseOfRestart, stop);
             return false;
         }
         if (wentBack && !records.empty()) {
@@ -132,7 +154,7 @@ private:
                                         anyFresh = true;
                                         return listener.show(event);
                                     },
-                                    listener.notice};
+                                    listener.notice, listener.begin};
         const bool more = showBatch(*continuity, records, watched);
         const std::int64_t behind = from + numbersAsked;
         if (anyFresh) {
@@ -173,6 +195,7 @@ private:
     const int* nextNumber;  ///< the library's, which askNewest sets to the newest
     void (*setNext)(int);
     int (*waitForEvents)();
+    void (*cancel)();
     const void* const* batch;  ///< the library's: null after a malformed answer
     const EventListener& listener;
     StreamStart beginning;

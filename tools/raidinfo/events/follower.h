@@ -1,5 +1,6 @@
 #pragma once
 
+#include <chrono>
 #include <cstdint>
 #include <functional>
 #include <optional>
@@ -26,6 +27,8 @@ struct Notice {
 struct EventListener {
     std::function<bool(const Record&)> show;
     std::function<void(const Notice&)> notice;
+    /// Of the number with which a stream begins that follows no earlier run; 0: any.
+    std::function<void(std::int64_t)> begin = [](std::int64_t /*first*/) {};
 };
 
 /// Where the stream begins: at the service's newest event, at a number, or after the last number
@@ -33,6 +36,7 @@ struct EventListener {
 struct StreamStart {
     std::optional<std::int64_t> first = std::nullopt;
     std::optional<LastShown> shownBefore = std::nullopt;
+    std::optional<std::chrono::milliseconds> patience = std::nullopt;  ///< for the first answer
 };
 
 /// Shows every event once until stop is requested or the listener has seen enough. A service that

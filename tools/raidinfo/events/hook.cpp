@@ -51,6 +51,13 @@ private:
     posix_spawnattr_t attributes{};
 };
 
+/// A supervisor may have left it ignored; then nobody learns how a child has ended.
+void noticeEndsOfChildren() {
+    struct sigaction usual = {};
+    usual.sa_handler = SIG_DFL;
+    sigaction(SIGCHLD, &usual, nullptr);
+}
+
 int endOf(pid_t child, const std::stop_token& stop) {
     {
         const std::stop_callback terminate{stop, [child] { kill(-child, SIGTERM); }};
@@ -71,6 +78,7 @@ int endOf(pid_t child, const std::stop_token& stop) {
 std::string runHook(const std::string& command, std::string_view input,
                     const std::stop_token& stop) {
     const MemoryFile file{input};
+    noticeEndsOfChildren();
     pid_t child = -1;
     if (const int error = Beginnings{file}.start(command, child); error != 0) {
         return "cannot be run: " + std::generic_category().message(error);

@@ -84,7 +84,7 @@ std::optional<std::size_t> Evidence::containerOf(std::size_t index, Count::Withi
 bool Evidence::isKnown(std::size_t index, const std::string& field, const Value& value) const {
     const int* const code = std::get_if<int>(&value);
     if (code == nullptr) {
-        return !std::holds_alternative<UnknownStatus>(value);
+        return !std::holds_alternative<Unknown>(value);
     }
     const auto kind = kindOfCodes(records[index].kind);
     return book.codes(kind, field) == nullptr || book.name(kind, field, *code);

@@ -12,7 +12,7 @@ OrderedJson orNull(const auto& optional) {
 }
 
 OrderedJson jsonOf(const Value& value) {
-    return std::visit(Overloaded{[](UnknownStatus) { return OrderedJson(nullptr); },
+    return std::visit(Overloaded{[](Unknown) { return OrderedJson(nullptr); },
                                  [](const auto& known) { return OrderedJson(known); }},
                       value);
 }

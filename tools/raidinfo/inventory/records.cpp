@@ -85,7 +85,7 @@ void RecordReader::readColumn(const Field& field, Records& records) {
         case Shape::statusText:
             return fillText(lib.function<void(char*, int)>(field.function),
                             [](std::string_view text) {
-                                return text.empty() ? Value{UnknownStatus{}} : Value{decoded(text)};
+                                return text.empty() ? Value{Unknown{}} : Value{decoded(text)};
                             });
         case Shape::numbers:
             return fillText(lib.function<void(char*, int)>(field.function), parsedNumbers);

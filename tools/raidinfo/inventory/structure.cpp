@@ -90,7 +90,7 @@ private:
         if (family == families.end()) {
             return {.title = "Adapter " + std::to_string(id),
                     .number = id,
-                    .extras = {{"family", UnknownStatus{}},
+                    .extras = {{"family", Unknown{}},
                                {"adapter_type", decoded(type)},
                                {"adapter_id", id}},
                     .remark = "unknown type \"" + printable(decoded(type)) + "\""};

@@ -6,13 +6,13 @@
 
 namespace raidinfo {
 
-/// A status text that the library does not know, hence no text.
-struct UnknownStatus {
-    bool operator==(const UnknownStatus&) const = default;
+/// What nobody knows: a status for which the library has no text, or what the tree does not tell.
+struct Unknown {
+    bool operator==(const Unknown&) const = default;
 };
 
 /// A field as it was read, texts decoded.
-using Value = std::variant<int, bool, std::string, UnknownStatus, std::vector<int>>;
+using Value = std::variant<int, bool, std::string, Unknown, std::vector<int>>;
 
 /// A value as people read it.
 [[nodiscard]] std::string shown(const Value& value);

@@ -1,7 +1,6 @@
 #include "json/envelope.h"
 
 #include <algorithm>
-#include <array>
 #include <nlohmann/json.hpp>
 #include <utility>
 
@@ -15,27 +14,13 @@ constexpr auto schemaVersion = "1.0";
 
 constexpr int indentation = 2;
 
-constexpr auto codes = std::to_array<std::pair<ExitStatus, std::string_view>>({
-    {ExitStatus::usage, "usage"},
-    {ExitStatus::badInput, "bad_input"},
-    {ExitStatus::noInput, "no_input"},
-    {ExitStatus::serviceUnavailable, "service_unavailable"},
-    {ExitStatus::internalError, "internal_error"},
-    {ExitStatus::unusableLibrary, "unusable_library"},
-    {ExitStatus::cannotCreate, "cannot_create"},
-    {ExitStatus::outputFailed, "output_failed"},
-    {ExitStatus::malformedAnswer, "malformed_answer"},
-});
-
 // File names in messages may hold any bytes.
 constexpr auto replaceInvalid = Json::error_handler_t::replace;
 
 }  // namespace
 
 std::string_view troubleCode(ExitStatus status) noexcept {
-    const auto found =
-        std::ranges::find(codes, status, &std::pair<ExitStatus, std::string_view>::first);
-    return found == codes.end() ? "internal_error" : found->second;
+    return std::ranges::find(statusWords, status, &StatusWords::status)->code;
 }
 
 Json enveloped(const Source& source, const std::vector<Trouble>& troubles, Json data) {

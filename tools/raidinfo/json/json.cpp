@@ -44,7 +44,7 @@ Json toJson(const Group& group) {
 }  // namespace
 
 Json toJson(const Value& value) {
-    return std::visit(Overloaded{[](UnknownStatus) { return Json(nullptr); },
+    return std::visit(Overloaded{[](Unknown) { return Json(nullptr); },
                                  [](const auto& known) { return Json(known); }},
                       value);
 }

@@ -34,11 +34,11 @@ Value valueOf(const Place& place, const TreeField& field) {
     if (field.holder) {
         // Enclosures stand below channels, and those below adapters.
         const auto depth = static_cast<std::size_t>(*field.holder);
-        return depth < place.holders.size() ? Value{place.holders[depth]->number} : UnknownStatus{};
+        return depth < place.holders.size() ? Value{place.holders[depth]->number} : Unknown{};
     }
     const auto& extras = place.node->extras;
     const auto found = std::ranges::find(extras, field.key, &Extras::value_type::first);
-    return found == extras.end() ? UnknownStatus{} : found->second;
+    return found == extras.end() ? Unknown{} : found->second;
 }
 
 }  // namespace
@@ -79,7 +79,7 @@ Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees
         row.emplace_back(static_cast<int>(position));
         const auto place = places.find(position);
         for (const TreeField& field : kind.fromTree) {
-            row.push_back(place == places.end() ? UnknownStatus{} : valueOf(place->second, field));
+            row.push_back(place == places.end() ? Unknown{} : valueOf(place->second, field));
         }
         row.insert(row.end(), records[position].begin(), records[position].end());
     }

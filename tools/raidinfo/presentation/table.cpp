@@ -15,6 +15,23 @@ bool isToTheRight(const ListColumn& column, const CodeBook::Meaning* meaning) {
            (meaning == nullptr || !std::holds_alternative<CodeBook::Codes>(*meaning));
 }
 
+std::vector<GridColumn> gridOf(const Listing& listing, const CodeBook& book) {
+    std::vector<GridColumn> columns;
+    columns.reserve(listing.columns.size() + 1);
+    for (std::size_t index = 0; index < listing.columns.size(); ++index) {
+        const ListColumn& listed = listing.columns[index];
+        const CodeBook::Meaning* const meaning =
+            listed.field == nullptr ? nullptr : book.find(listing.kind->key, listed.field->key);
+        GridColumn& column = columns.emplace_back(
+            GridColumn{std::string{listed.title}, isToTheRight(listed, meaning), {}});
+        column.cells.reserve(listing.rows.size());
+        for (const std::vector<Value>& row : listing.rows) {
+            column.cells.push_back({shown(row[index], meaning), styleOf(row[index], listed.field)});
+        }
+    }
+    return columns;
+}
+
 }  // namespace
 
 Style styleOf(const Value& value, const Field* field) {
@@ -34,19 +51,13 @@ Style styleOf(const Value& value, const Field* field) {
 }
 
 std::string table(const Listing& listing, const GridLayout& layout, const CodeBook& book) {
-    std::vector<GridColumn> columns;
-    columns.reserve(listing.columns.size());
-    for (std::size_t index = 0; index < listing.columns.size(); ++index) {
-        const ListColumn& listed = listing.columns[index];
-        const CodeBook::Meaning* const meaning =
-            listed.field == nullptr ? nullptr : book.find(listing.kind->key, listed.field->key);
-        GridColumn& column = columns.emplace_back(
-            GridColumn{std::string{listed.title}, isToTheRight(listed, meaning), {}});
-        column.cells.reserve(listing.rows.size());
-        for (const std::vector<Value>& row : listing.rows) {
-            column.cells.push_back({shown(row[index], meaning), styleOf(row[index], listed.field)});
-        }
-    }
+    return drawn(gridOf(listing, book), layout);
+}
+
+std::string namedTable(const Listing& listing, const GridLayout& layout, const CodeBook& book) {
+    std::vector<GridColumn> columns = gridOf(listing, book);
+    const std::vector<Cell> names(listing.rows.size(), Cell{std::string{listing.kind->key}});
+    columns.insert(columns.begin(), GridColumn{"Kind", false, names});
     return drawn(columns, layout);
 }
 

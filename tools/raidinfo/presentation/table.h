@@ -16,7 +16,12 @@ namespace raidinfo {
 [[nodiscard]] std::string table(const Listing& listing, const GridLayout& layout,
                                 const CodeBook& book);
 
-/// The same below the title of the kind and the number of rows; no grid if there are none.
+/// The same with the kind in front of each row, for who reads the rows of several kinds.
+[[nodiscard]] std::string namedTable(const Listing& listing, const GridLayout& layout,
+                                     const CodeBook& book);
+
+/// The same as `table` below the title of the kind and the number of rows; no grid if there are
+/// none.
 [[nodiscard]] std::string titledTable(const Listing& listing, const GridLayout& layout,
                                       const CodeBook& book);
 

@@ -34,7 +34,7 @@ private:
         const std::string said =
             painter(shown(value, meaningOf(kind, field)), styleOf(value, &field));
         const bool needsTitle =
-            std::holds_alternative<UnknownStatus>(value) || field.shape != Shape::statusText;
+            std::holds_alternative<Unknown>(value) || field.shape != Shape::statusText;
         return needsTitle ? inSentence(field.title) + " " + said : said;
     }
 

@@ -147,23 +147,30 @@ private:
 
 }  // namespace
 
-void recordAnswers(const Library& library, const EntrySink& sink,
-                   std::optional<std::chrono::seconds> duration, const std::stop_token& stop) {
+void recordAnswers(const Library& library, const EntrySink& sink, const RecordingTime& time,
+                   const std::stop_token& stop) {
     std::stop_source over;
     const std::stop_callback stopped{stop, [&over] { over.request_stop(); }};
+    const auto end = [&over, cancel = library.function<void()>("cancelGetEvent")] {
+        over.request_stop();
+        cancel();
+    };
+    const bool endsAtOnce = time.whole == std::chrono::seconds{0};
+    std::optional<Alarm> alarm;
+    std::optional<Alarm> ofFirstAnswer;
+    if (time.whole && !endsAtOnce) {
+        alarm.emplace(*time.whole, end);
+    }
+    if (time.firstAnswer) {
+        ofFirstAnswer.emplace(*time.firstAnswer, end);
+    }
     Recorder recorder{library, sink, over.get_token()};
     if (!recorder.recordAll()) {
-        throw serviceUnavailable();
+        throw over.stop_requested() ? noAnswerInTime() : serviceUnavailable();
     }
-    if (duration == std::chrono::seconds{0}) {
+    ofFirstAnswer.reset();
+    if (endsAtOnce) {
         return;
-    }
-    std::optional<Alarm> alarm;
-    if (duration) {
-        alarm.emplace(*duration, [&over, cancel = library.function<void()>("cancelGetEvent")] {
-            over.request_stop();
-            cancel();
-        });
     }
     Backoff backoff;
     while (!over.stop_requested()) {

@@ -10,6 +10,11 @@ namespace raidinfo {
             "the RAID management service on " + ServiceAddress::inWords() + " does not answer"};
 }
 
+[[nodiscard]] inline Failure noAnswerInTime() {
+    return {ExitStatus::serviceUnavailable,
+            "the RAID management service gave no answer within the --timeout"};
+}
+
 [[nodiscard]] inline Failure malformedAnswer() {
     return {ExitStatus::malformedAnswer, "the answer of the RAID management service is malformed"};
 }

@@ -9,9 +9,12 @@
 namespace raidinfo {
 
 Alarm::Alarm(std::chrono::milliseconds after, std::function<void()> cancel)
-    : clock{[after, cancel = std::move(cancel),
-             waiting = pthread_self()](const std::stop_token& stop) {
+    : clock{[after, cancel = std::move(cancel), waiting = pthread_self(),
+             source = timeIsOver](const std::stop_token& stop) mutable {
           pauseUnlessStopped(after, stop);
+          if (!stop.stop_requested()) {
+              source.request_stop();
+          }
           while (!stop.stop_requested()) {
               cancel();
               wake(waiting);

@@ -2,6 +2,7 @@
 
 #include <chrono>
 #include <functional>
+#include <stop_token>
 #include <thread>
 
 namespace raidinfo {
@@ -12,7 +13,11 @@ class Alarm {
 public:
     Alarm(std::chrono::milliseconds after, std::function<void()> cancel);
 
+    /// Requested to stop once the time is over.
+    [[nodiscard]] std::stop_token over() const { return timeIsOver.get_token(); }
+
 private:
+    std::stop_source timeIsOver;
     std::jthread clock;
 };
 

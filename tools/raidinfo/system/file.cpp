@@ -134,6 +134,10 @@ std::string readFile(const std::filesystem::path& path) {
         }
         if (size > 0) {
             content.append(piece.data(), static_cast<std::size_t>(size));
+            if (content.size() > longestFile) {
+                throw Failure{ExitStatus::badInput, path.string() + " is longer than " +
+                                                        std::to_string(longestFile) + " bytes"};
+            }
         } else if (errno != EINTR) {
             throw failure(ExitStatus::noInput, "cannot read", path);
         }

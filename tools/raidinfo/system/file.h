@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <filesystem>
 #include <string>
 #include <string_view>
@@ -8,7 +9,10 @@
 
 namespace raidinfo {
 
-/// The whole file; one that cannot be read is a noInput Failure.
+/// Longer than any recording that is of use, and short enough for the program's memory.
+constexpr std::size_t longestFile = std::size_t{256} * 1024 * 1024;
+
+/// The whole file; one that cannot be read is a noInput Failure, a longer one a badInput Failure.
 [[nodiscard]] std::string readFile(const std::filesystem::path& path);
 
 /// Writes the file beside its place and then moves it there, so that nobody ever sees half of it.

@@ -45,7 +45,7 @@ TEST(CodeBook, ShowsTheNumberBesideItsName) {
     EXPECT_EQ(book.shown("disk_drives", "size", 70006), "70006 MB");
     EXPECT_EQ(book.shown("disk_drives", "channel_id", 2), "2");
     EXPECT_EQ(book.shown("disk_drives", "smart_error", true), "yes");
-    EXPECT_EQ(book.shown("disk_drives", "overall_status", UnknownStatus{}), "unknown");
+    EXPECT_EQ(book.shown("disk_drives", "overall_status", Unknown{}), "unknown");
 }
 
 TEST(CodeBook, HasUnits) {

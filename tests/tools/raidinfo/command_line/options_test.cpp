@@ -51,14 +51,16 @@ TEST(Options, AskForJsonAndALibraryOnEitherSideOfTheCommand) {
     EXPECT_EQ(options({"events", "--library", "b.so"}).library, "b.so");
 }
 
-TEST(Options, LimitTheWaitButOfWhatFollowsTheService) {
+TEST(Options, LimitTheProgramOrTheFirstAnswer) {
     EXPECT_EQ(options({"list"}).limit, std::chrono::seconds{60});
     EXPECT_EQ(options({"tree", "--timeout", "5"}).limit, std::chrono::seconds{5});
     EXPECT_EQ(options({"tree", "--timeout", "0"}).limit, std::nullopt);
-    EXPECT_EQ(options({"events", "--timeout", "5"}).limit, std::nullopt);
-    EXPECT_EQ(options({"watch"}).limit, std::nullopt);
-    EXPECT_EQ(options({"record", "file"}).limit, std::nullopt);
-    EXPECT_EQ(command<DoctorOptions>({"doctor"}).limit, std::chrono::seconds{60});
+    EXPECT_EQ(options({"tree"}).limited, Limited::program);
+    for (const char* const name : {"events", "watch", "health", "doctor"}) {
+        EXPECT_EQ(options({name}).limited, Limited::answer) << name;
+        EXPECT_EQ(options({name}).limit, std::chrono::seconds{60}) << name;
+    }
+    EXPECT_EQ(options({"list"}).limitOf(Limited::answer), std::nullopt);
 }
 
 TEST(Options, ChooseTheColour) {
@@ -131,15 +133,27 @@ TEST(DiffOptions, NameOneSnapshotOrTwo) {
 
 TEST(Options, ThatAreWrongAreAUsageFailure) {
     using Arguments = std::vector<const char*>;
-    for (const Arguments& wrong :
-         {Arguments{}, Arguments{"lists"}, Arguments{"tree", "list", "--jso"},
-          Arguments{"list", "--jsonn"}, Arguments{"tree", "extra"},
-          Arguments{"list", "--timeout", "-1"}, Arguments{"list", "--timeout", "soon"},
-          Arguments{"list", "--library"}, Arguments{"list", "--filter", "state"},
-          Arguments{"list", "fans", "-o", ","}, Arguments{"events", "--count", "0"},
-          Arguments{"watch", "--interval", "0"}, Arguments{"snapshot"}, Arguments{"diff"},
-          Arguments{"health", "--nagios", "--explain"}, Arguments{"health", "--nagios", "--json"},
-          Arguments{"--json", "health", "--nagios"}}) {
+    for (const Arguments& wrong : {Arguments{},
+                                   Arguments{"lists"},
+                                   Arguments{"tree", "list", "--jso"},
+                                   Arguments{"list", "--jsonn"},
+                                   Arguments{"tree", "extra"},
+                                   Arguments{"list", "--timeout", "-1"},
+                                   Arguments{"list", "--timeout", "soon"},
+                                   Arguments{"list", "--library"},
+                                   Arguments{"list", "--filter", "state"},
+                                   Arguments{"list", "fans", "-o", ","},
+                                   Arguments{"events", "--count", "0"},
+                                   Arguments{"watch", "--interval", "0"},
+                                   Arguments{"snapshot"},
+                                   Arguments{"diff"},
+                                   Arguments{"health", "--nagios", "--explain"},
+                                   Arguments{"health", "--nagios", "--json"},
+                                   Arguments{"--json", "health", "--nagios"},
+                                   Arguments{"watch", "--from", "a"},
+                                   Arguments{"doctor", "--from", "a"},
+                                   Arguments{"--from", "a", "record", "b"},
+                                   Arguments{"diff", "a", "b", "--from", "c"}}) {
         EXPECT_NE(complaint(wrong), "accepted") << testing::PrintToString(wrong);
     }
 }
@@ -159,7 +173,7 @@ TEST(Options, RefuseAnEmptyValue) {
 }
 
 TEST(Options, ExplainThemselves) {
-    EXPECT_THAT(information({"--help"}), HasSubstr("130 interrupted"));
+    EXPECT_THAT(information({"--help"}), HasSubstr("130         interrupted"));
     EXPECT_THAT(information({"--version"}), testing::StartsWith("raidinfo "));
     for (const char* const name : {"list", "show", "tree", "events", "watch", "health", "snapshot",
                                    "diff", "record", "doctor", "completion", "schema"}) {

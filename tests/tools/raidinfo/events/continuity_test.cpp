@@ -47,6 +47,33 @@ TEST(Continuity, ShowsEachEventOnce) {
     EXPECT_EQ(continuity.last(), 44);
 }
 
+TEST(Continuity, TakesTwoEventsOfOneNumberForTheSameHistory) {
+    Continuity continuity{5};
+    const Records two{event(5, "a"), event(5, "b")};
+    EXPECT_THAT(shownEvents(continuity, two), ElementsAre(5, 5));
+    EXPECT_EQ(continuity.compared(two), Continuity::History::same);
+    EXPECT_EQ(continuity.compared({event(5, "c")}), Continuity::History::different);
+}
+
+TEST(Continuity, DoesNotHoldTheEventsOfTheCountBeforeAgainstThoseOfANewOne) {
+    Continuity continuity{1};
+    static_cast<void>(continuity.accept({event(1, "old"), event(2, "old"), event(3, "same")}));
+    continuity.beginAnew();
+    EXPECT_THAT(shownEvents(continuity, {event(1, "new")}), ElementsAre(1));
+    const Records more{event(1, "new"), event(2, "new"), event(3, "same")};
+    EXPECT_EQ(continuity.compared(more), Continuity::History::same);
+    EXPECT_THAT(shownEvents(continuity, more), ElementsAre(2)) << "3 was shown as it is";
+    EXPECT_EQ(continuity.compared({event(3, "other")}), Continuity::History::different)
+        << "it belongs to the new count, too";
+}
+
+TEST(Continuity, BeginsAtAnyNumberAfterARunThatFoundNoEvent) {
+    Continuity continuity = Continuity::after({0});
+    const auto accepted = continuity.accept(batch({7, 8}));
+    EXPECT_THAT(accepted.fresh, ElementsAre(0U, 1U));
+    EXPECT_THAT(accepted.missing, IsEmpty());
+}
+
 TEST(Continuity, PassesOverWhatIsBeforeItsBeginning) {
     Continuity continuity{41};
     EXPECT_THAT(shownOf(continuity, {39, 40, 41}), ElementsAre(41));

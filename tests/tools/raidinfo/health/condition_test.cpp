@@ -70,9 +70,9 @@ TEST(Condition, OnAnUnknownCodeHoldsForNumbersAndForNoName) {
     EXPECT_FALSE(finds(machine, "fans", R"({ field = "status", known = false })"));
 }
 
-TEST(Condition, OnAnUnknownStatusHoldsForNoWord) {
+TEST(Condition, OnAnUnknownHoldsForNoWord) {
     Machine machine;
-    machine.set(KindId::enclosure, 0, "overall_status", UnknownStatus{});
+    machine.set(KindId::enclosure, 0, "overall_status", Unknown{});
     EXPECT_FALSE(finds(machine, "enclosures", R"({ field = "overall_status", is = "Normal" })"));
     EXPECT_FALSE(finds(machine, "enclosures", R"({ field = "overall_status", not = "Normal" })"));
     EXPECT_TRUE(finds(machine, "enclosures", R"({ field = "overall_status", known = false })"));

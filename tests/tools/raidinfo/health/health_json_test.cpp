@@ -92,7 +92,7 @@ message = "state {state}"
 
 TEST(HealthJson, HasNullForWhatIsUnknownOrUnpublished) {
     Machine machine;
-    machine.set(KindId::enclosure, 0, "overall_status", UnknownStatus{});
+    machine.set(KindId::enclosure, 0, "overall_status", Unknown{});
     machine.setExtra(machine.member(0), "present", false);
     machine.member(0).position.reset();
     const ordered_json findings = dataOf(machine)["findings"];

@@ -150,8 +150,7 @@ const std::vector<RuleCase> cases{
      setting(KindId::enclosure, 0, "overall_status", std::string{"Warning"}),
      setting(KindId::enclosure, 0, "overall_status", std::string{"Critical"})},
     {"overall-status-unknown", Severity::unknown, "adapter 1, serial AD001417",
-     "overall status unknown",
-     setting(KindId::pellionAdapter, 0, "overall_status", UnknownStatus{}),
+     "overall status unknown", setting(KindId::pellionAdapter, 0, "overall_status", Unknown{}),
      setting(KindId::pellionAdapter, 0, "overall_status", std::string{"Critical"})},
     {"state-unknown", Severity::unknown, "adapter 1, channel 1, disk drive 1, serial QS1",
      "state 5 (unknown)", setting(KindId::diskDrive, 1, "state", 5),
@@ -175,11 +174,10 @@ const std::vector<RuleCase> cases{
          machine.adapter().record = nullptr;
          machine.adapter().kind = nullptr;
          machine.adapter().position.reset();
-         machine.adapter().extras = {{"family", UnknownStatus{}},
-                                     {"adapter_type", std::string{"o:Other"}},
-                                     {"adapter_id", 1}};
+         machine.adapter().extras = {
+             {"family", Unknown{}}, {"adapter_type", std::string{"o:Other"}}, {"adapter_id", 1}};
      },
-     setting(KindId::pellionAdapter, 0, "overall_status", UnknownStatus{})},
+     setting(KindId::pellionAdapter, 0, "overall_status", Unknown{})},
 };
 
 class DefaultRule : public testing::TestWithParam<RuleCase> {};
@@ -261,7 +259,7 @@ TEST(DefaultRules, CallNothingOkWhoseCodesAreUnknown) {
     for (const KindId kind :
          {KindId::pellionAdapter, KindId::logicalDrive, KindId::diskDrive, KindId::enclosure}) {
         Machine machine;
-        machine.set(kind, 0, "overall_status", UnknownStatus{});
+        machine.set(kind, 0, "overall_status", Unknown{});
         EXPECT_EQ(judged(machine).severity, Severity::unknown) << kindOf(kind).key;
     }
 }

@@ -12,7 +12,7 @@ TEST(ShownValue, IsShortAndPlain) {
     EXPECT_EQ(shown(std::string{"A&B"}), "A&B");
     EXPECT_EQ(shown(std::string{}), "-");
     EXPECT_EQ(shown(std::string{"a\nb"}), "a\\u{a}b");
-    EXPECT_EQ(shown(UnknownStatus{}), "unknown");
+    EXPECT_EQ(shown(Unknown{}), "unknown");
     EXPECT_EQ(shown(std::vector<int>{7, -1, 7}), "7,-1,7");
     EXPECT_EQ(shown(std::vector<int>{}), "-");
 }

@@ -46,7 +46,7 @@ TEST(TreeJson, NestsTheListsAndWritesAReferenceShort) {
                 .position = 4,
                 .inFull = false};
     Node full{.title = "",
-              .extras = {{"family", UnknownStatus{}}, {"numbers", std::vector<int>{7, 8}}},
+              .extras = {{"family", Unknown{}}, {"numbers", std::vector<int>{7, 8}}},
               .kind = &channels,
               .record = &channel,
               .position = 0,

@@ -29,7 +29,7 @@ protected:
                             {"state", 4},
                             {"overall_status", "Critical"},
                             {"smart_error", true}}),
-            sample(drives, {{"state", 12}, {"overall_status", UnknownStatus{}}})};
+            sample(drives, {{"state", 12}, {"overall_status", Unknown{}}})};
         Node channel{.title = "Channel 1"};
         for (std::size_t position = 0; position < 2; ++position) {
             channel.groups.push_back(
@@ -71,9 +71,8 @@ protected:
 TEST_F(DriveListing, HasAColumnForPositionTreeAndEachField) {
     EXPECT_EQ(listing.columns.size(), 1 + 2 + drives.fields.size());
     EXPECT_THAT(column(listing, "position"), ElementsAre(Value{0}, Value{1}, Value{2}));
-    EXPECT_THAT(column(listing, "device_id"), ElementsAre(Value{8}, Value{9}, UnknownStatus{}));
-    EXPECT_THAT(column(listing, "hot_spare"),
-                ElementsAre(Value{false}, Value{true}, UnknownStatus{}));
+    EXPECT_THAT(column(listing, "device_id"), ElementsAre(Value{8}, Value{9}, Unknown{}));
+    EXPECT_THAT(column(listing, "hot_spare"), ElementsAre(Value{false}, Value{true}, Unknown{}));
     EXPECT_THAT(column(listing, "state"), ElementsAre(Value{1}, Value{4}, Value{12}));
 }
 

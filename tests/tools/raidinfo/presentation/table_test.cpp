@@ -25,7 +25,7 @@ TEST(StatusWord, HasTheLookOfItsMeaning) {
     EXPECT_EQ(styleOf(std::string{"Normal"}, &status), Style::good);
     EXPECT_EQ(styleOf(std::string{"Warning"}, &status), Style::warning);
     EXPECT_EQ(styleOf(std::string{"Critical"}, &status), Style::critical);
-    EXPECT_EQ(styleOf(UnknownStatus{}, &status), Style::unknown);
+    EXPECT_EQ(styleOf(Unknown{}, &status), Style::unknown);
     EXPECT_EQ(styleOf(std::string{"Critical"}, &drives.fields[0]), Style::plain);
     EXPECT_EQ(styleOf(std::string{"Critical"}, nullptr), Style::plain);
 }
@@ -41,6 +41,15 @@ TEST(Table, AlignsNumbersToTheRightAndTextsToTheLeft) {
               "  #  Fan name      Status name    Status\n"
               "  0  Disk Drive 0  é                   5\n"
               "  1  日本          -            -1234567\n");
+}
+
+TEST(Table, HasTheKindInFrontOfEachRowWhereSeveralKindsFollowEachOther) {
+    const Listing listing =
+        withColumns(listingOfFans({sample(fans, {{"status", 5}}), sample(fans, {{"status", 6}})}),
+                    chosenColumns(parseColumns("position,status"), fans));
+    EXPECT_EQ(namedTable(listing, {.headings = false}, CodeBook{}),
+              "  fans  0  5\n"
+              "  fans  1  6\n");
 }
 
 TEST(Table, HasTheMeaningOfACodeBesideIt) {

@@ -54,7 +54,7 @@ TEST(DrawnTree, SummarisesARecord) {
 
 TEST(DrawnTree, SaysThatAStatusIsUnknown) {
     const Kind& drives = kindOf(KindId::logicalDrive);
-    const Record drive = sample(drives, {{"overall_status", UnknownStatus{}}});
+    const Record drive = sample(drives, {{"overall_status", Unknown{}}});
     const Node node{.title = "Logical drive 0", .kind = &drives, .record = &drive};
     EXPECT_EQ(drawn({"roots", {node}}, CodeBook{}),
               "Logical drive 0: overall status unknown, RAID level 0, state 0, data space 0\n");

@@ -53,7 +53,7 @@ TEST(CancellableRun, RepeatsTheCancelUntilTheWorkHasEnded) {
         },
         soon);
     EXPECT_TRUE(ending.timedOut);
-    EXPECT_EQ(cancels, 3);
+    EXPECT_GE(cancels, 3);
 }
 
 TEST(CancellableRun, InterruptsTheSystemCallThatTheWorkWaitsIn) {
