@@ -6,8 +6,8 @@
 #include <set>
 #include <string>
 
-#include "model/event_classes.h"
 #include "model/classes.h"
+#include "model/event_classes.h"
 
 namespace {
 

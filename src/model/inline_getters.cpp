@@ -5,11 +5,11 @@
 #include <type_traits>
 #include <utility>
 
-#include "model/raid_events.h"
 #include "model/arrays.h"
 #include "model/channels_and_drives.h"
 #include "model/enclosures.h"
 #include "model/logical_drives.h"
+#include "model/raid_events.h"
 #include "model/system_and_adapter.h"
 
 namespace raid {

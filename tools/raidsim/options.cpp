@@ -154,6 +154,20 @@ void checkAlone(const CLI::App& app, const CLI::App& subcommand) {
     }
 }
 
+// The document is made in memory, where a drive takes some kilobytes.
+void checkSize(const CLI::App& command, const generate::Order& order) {
+    constexpr double mostPlaces = 1'000'000;
+    const generate::RackSize& rack = order.rack;
+    const double channels = 1.0 * rack.adapters * rack.channels;
+    if (channels + channels * rack.drives > mostPlaces)
+        throw UsageError("a rack has 1000000 channels and drives at most");
+    for (const char* const size : {"--adapters", "--channels", "--drives"}) {
+        if (order.events && command.count(size) > 0)
+            throw UsageError("--events writes no rack, so " + std::string(size) +
+                             " does not go with it");
+    }
+}
+
 void checkTogether(const CLI::App& app, const Options& options) {
     if (!options.config.empty() && !options.replay.empty())
         throw UsageError("--replay serves a recording in place of CONFIG; both are given");
@@ -201,8 +215,10 @@ Wanted parseOptions(int argc, const char* const* argv) {
         return options;
     }
     checkAlone(app, *subcommands.front());
-    if (subcommands.front()->get_name() == "generate")
+    if (subcommands.front()->get_name() == "generate") {
+        checkSize(*subcommands.front(), order);
         return order;
+    }
     return Information{completionOf(app)};
 }
 

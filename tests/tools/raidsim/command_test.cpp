@@ -220,7 +220,8 @@ TEST_F(CommandLine, ErrorsAreOneLineThatSaysWhatIsWrong) {
     EXPECT_EQ(errorOf("quit now"), "usage: quit");
     EXPECT_EQ(errorOf("event"), "usage: event [place=last|first|before:N|after:N] field=value...");
     EXPECT_EQ(errorOf("event color=red"), "event: an event has no field \"color\"");
-    EXPECT_EQ(errorOf("event channel=one"), "event: \"one\" is not a number");
+    EXPECT_EQ(errorOf("event channel=one"),
+              "event: \"one\" is no number from -2147483648 to 2147483647");
     EXPECT_EQ(errorOf("set adapter:1 state"), "set: \"state\" is not of the form field=value");
     EXPECT_EQ(errorOf("set adapter:1 =4"), "set: \"=4\" is not of the form field=value");
     EXPECT_EQ(errorOf("set disk:1 a=b"), "set: there is no kind of object \"disk\"");

@@ -229,15 +229,15 @@ bool beginsAnew(Continuity& continuity, const Records& batch, bool wentBack,
 }
 
 bool showBatch(Continuity& continuity, const Records& batch, const EventListener& listener) {
-    const auto [fresh, missing] = continuity.accept(batch);
+    const Continuity::Accepted accepted = continuity.accept(batch);
     // Each gap is told where it is, so that a reader who has seen enough hears of none behind it.
-    auto gap = missing.begin();
+    auto gap = accepted.missing.begin();
     const auto tellGapsBelow = [&](std::int64_t number) {
-        for (; gap != missing.end() && gap->first < number; ++gap) {
+        for (; gap != accepted.missing.end() && gap->first < number; ++gap) {
             listener.notice({"events_missing", told(*gap)});
         }
     };
-    for (const std::size_t place : fresh) {
+    for (const std::size_t place : accepted.fresh) {
         tellGapsBelow(numberOf(eventKind(), batch[place], "sequence_number"));
         if (!listener.show(batch[place])) {
             return false;

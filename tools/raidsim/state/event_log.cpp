@@ -70,7 +70,7 @@ void EventLog::check(const Fields& fields) {
         if (field == vocabulary.end())
             throw EventError("an event has no field \"" + name + "\"");
         if (field->xsiType == asNumber && !parseInt(value))
-            throw EventError("\"" + value + "\" is not a number");
+            throw EventError("\"" + value + "\" is no number from -2147483648 to 2147483647");
     }
 }
 
