@@ -162,9 +162,10 @@ void checkSize(const CLI::App& command, const generate::Order& order) {
     if (channels + channels * rack.drives > mostPlaces)
         throw UsageError("a rack has 1000000 channels and drives at most");
     for (const char* const size : {"--adapters", "--channels", "--drives"}) {
-        if (order.events && command.count(size) > 0)
+        if (order.events && command.count(size) > 0) {
             throw UsageError("--events writes no rack, so " + std::string(size) +
                              " does not go with it");
+        }
     }
 }
 

@@ -9,11 +9,11 @@ namespace raidinfo {
 
 /// A subcommand: its name, its help, its options, and what is made of them.
 struct Subcommand {
-    const char* name;
-    const char* summary;
-    const char* examples;
-    void (*declare)(CLI::App&, Words&);
-    CommandOptions (*read)(const CLI::App&, const Words&);
+    const char* name = nullptr;
+    const char* summary = nullptr;
+    const char* examples = nullptr;
+    void (*declare)(CLI::App&, Words&) = nullptr;
+    CommandOptions (*read)(const CLI::App&, const Words&) = nullptr;
     Limited limited = Limited::program;
     const char* withoutRecording = nullptr;  ///< why --from is refused, where it is
 };
