@@ -57,8 +57,9 @@ ColumnChoice columnsOf(const ListOptions& list, bool json) {
 Listing chosen(const Kind& kind, const Trees& trees, const ListOptions& list,
                const Session& session) {
     const auto columns = chosenColumns(columnsOf(list, session.options().json), kind);
-    const Listing whole = listingOf(kind, trees.snapshot(), trees.adapters());
-    return withColumns(filtered(whole, list.filters, session.codeBook()), columns);
+    return withColumns(filtered(listingOf(kind, trees.snapshot(), trees.adapters()), list.filters,
+                                session.codeBook()),
+                       columns);
 }
 
 }  // namespace
