@@ -104,22 +104,21 @@ Continuity::Accepted Continuity::accept(const Records& batch) {
 /// What was shown before the service began to count anew says nothing of the events that it has
 /// now.
 Continuity::History Continuity::compared(const Records& batch) const {
-    History history = History::unknown;
+    std::map<std::int64_t, bool> isThere;  // by the numbers that were shown: any event that was
     for (const Record& event : batch) {
         const Event looked{numberOf(event), contentOf(event)};
-        bool isNumberKnown = false;
-        bool isKnown = false;
         for (auto known = shown.lower_bound({looked.first, 0});
              known != shown.end() && known->first.first == looked.first; ++known) {
-            isNumberKnown |= known->second == count;
-            isKnown |= known->second == count && known->first == looked;
+            if (known->second == count) {
+                isThere[looked.first] |= known->first == looked;
+            }
         }
-        if (isNumberKnown && !isKnown) {
-            return History::different;
-        }
-        history = isKnown ? History::same : history;
     }
-    return history;
+    if (isThere.empty()) {
+        return History::unknown;
+    }
+    const bool all = std::ranges::all_of(isThere, [](const auto& number) { return number.second; });
+    return all ? History::same : History::different;
 }
 
 void Continuity::beginAnew() {

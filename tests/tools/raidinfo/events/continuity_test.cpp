@@ -53,6 +53,8 @@ TEST(Continuity, TakesTwoEventsOfOneNumberForTheSameHistory) {
     EXPECT_THAT(shownEvents(continuity, two), ElementsAre(5, 5));
     EXPECT_EQ(continuity.compared(two), Continuity::History::same);
     EXPECT_EQ(continuity.compared({event(5, "c")}), Continuity::History::different);
+    EXPECT_EQ(continuity.compared({event(5, "a"), event(5, "c")}), Continuity::History::same)
+        << "one more of this number is only new";
 }
 
 TEST(Continuity, DoesNotHoldTheEventsOfTheCountBeforeAgainstThoseOfANewOne) {
