@@ -2,7 +2,8 @@
 """Watches the RAID controllers of this machine: an example to copy.
 
 Prints what there is, then every event as it happens and what has changed in the health of the
-drives since the one before. Goes on when the service comes back after it was gone. Ctrl-C ends it.
+drives since the one before. Goes on when the service comes back after it was gone, and when it
+counts its events anew. Ctrl-C ends it.
 """
 
 import argparse
@@ -11,6 +12,7 @@ import time
 from collections.abc import Mapping
 
 from raidinstrumentation import (
+    EventLogRestarted,
     EventStream,
     Inventory,
     RAIDError,
@@ -86,6 +88,8 @@ def main() -> None:
             except ServiceUnavailable as problem:
                 print(f"{problem}; trying again", file=sys.stderr)
                 time.sleep(SECONDS_BETWEEN_ATTEMPTS)
+            except EventLogRestarted as problem:
+                print(f"{problem}; this is what it has", file=sys.stderr)
 
 
 if __name__ == "__main__":

@@ -30,13 +30,17 @@ class MalformedAnswer(RAIDError):
 
 
 class EventLogRestarted(RAIDError):
-    """The service's newest event has a lower number than one seen before.
+    """The service counts its events anew, so that a number says no longer what comes after it.
 
-    Its log began anew, so that "what comes after" the one seen has no meaning any more. Which of
-    its events are new only the caller can decide.
+    It has another event with a number that was seen, or its newest event has a lower number than
+    one seen before and it knows none of those seen. Whether old events are among those that it has
+    now only the caller can decide.
     """
 
     def __init__(self, newest: int, seen: int) -> None:
-        super().__init__(f"the newest event has number {newest}, but {seen} was seen before")
+        super().__init__(
+            f"the service counts its events anew: the newest has number {newest},"
+            f" and those up to {seen} that were seen before are gone"
+        )
         self.newest = newest
         self.seen = seen

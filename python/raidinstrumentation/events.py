@@ -1,55 +1,67 @@
 """The event stream."""
 
+import contextlib
+import logging
 import threading
 from collections import deque
-from collections.abc import Iterator
+from collections.abc import Callable, Iterator
 
 from .calls import Call, CallCancelled
-from .errors import EventLogRestarted, MalformedAnswer, ServiceUnavailable
+from .continuity import Continuity
+from .follower import Follower
 from .library import Library
 from .records import Event
-from .text import TextBuffer
 
-LARGEST_NUMBER = 2**31 - 1
-# So many numbers the library asks for at once.
-_BATCH = 101
-_PAUSE_AFTER_NOTHING = 0.2
-# A service that answers, but whose events could not be read so often in a row, sends malformed ones.
-_MALFORMED_READS = 2
+_LOG = logging.getLogger("raidinstrumentation")
 
 
 class EventStream(Iterator[Event]):
-    """The events as they happen, each once, in the order in which the service sends them.
+    """The events as they happen, each once, as the service sends them and each batch by its numbers.
 
     Waits for the next one without limit; Ctrl-C and cancel end the wait at once. ServiceUnavailable
     and MalformedAnswer do not end the stream: the next call of next() goes on where it stood, so
-    that nothing is lost or comes twice when the service restarts.
+    that nothing is lost or comes twice when the service restarts. Nor does EventLogRestarted; what
+    comes after it is everything that the service has, but for what came before just so.
+
+    Numbers that the service passes over are in missing, and the logger "raidinstrumentation" warns
+    of them before the event behind them comes. Events that come late are not held back.
 
     One thread at a time can wait for events, whatever the number of streams; another one gets a
     RuntimeError.
     """
 
-    def __init__(self, library: Library, first: int) -> None:
-        """Made by RAIDInstrumentation.events; first is the number of the first event."""
+    def __init__(self, library: Library, first: int, known: int | None = None) -> None:
+        """Made by RAIDInstrumentation.events.
+
+        It begins at the first number, or at whatever comes first where that is 0. Of an event with
+        the known number it is known that it was there.
+        """
         self._library = library
-        self._next = first
-        self._fetched: deque[Event] = deque()
+        self._continuity = Continuity(first, known)
+        self._follower = Follower(library, self._continuity)
+        self._fetched: deque[Event | range] = deque()
         self._is_cancelled = False
         self._call: Call[None] | None = None
 
     def __next__(self) -> Event:
         while not self._is_cancelled:
             try:
-                return self._fetched.popleft()
+                fetched = self._fetched.popleft()
             except IndexError:
-                pass
-            self._call = Call(self._fetch, self._library.cancel)
-            if not self._is_cancelled:
-                try:
-                    self._call.result()
-                except CallCancelled:
-                    break
+                self._fetch()
+                continue
+            if isinstance(fetched, Event):
+                return fetched
+            _LOG.warning(_told(fetched))
         raise StopIteration
+
+    @property
+    def missing(self) -> tuple[range, ...]:
+        """The numbers that the service has passed over and not sent since, by what was read so far.
+
+        Of very many gaps the oldest are forgotten.
+        """
+        return self._continuity.missing
 
     def cancel(self) -> None:
         """Ends the stream, also while another thread waits for it; its iteration just ends.
@@ -60,51 +72,25 @@ class EventStream(Iterator[Event]):
         if self._call is not None:
             self._call.cancel()
 
-    # What follows runs on the call's thread, where no signal handler can break it off.
+    def confirmation(self) -> Call[None]:
+        """A call that raises EventLogRestarted if the service counts anew."""
+        return self._call_for(self._follower.confirm)
 
-    def _fetch(self, stopping: threading.Event) -> None:
-        with self._library.event_turn():
-            failed_reads = 0
-            while not stopping.is_set():
-                newest = self._library.newest_event(stopping)
-                if newest is None:
-                    raise ServiceUnavailable
-                # A service that counts anew would be waited for in vain.
-                check_newest(newest, self._next - 1)
-                if failed_reads == _MALFORMED_READS:
-                    raise MalformedAnswer
-                cancels = self._library.cancels
-                came = self._library.ask_for_events(min(self._next, LARGEST_NUMBER))
-                batch = self._read_batch()
-                if self._keep_unseen(batch):
-                    return
-                # That nothing came tells nothing after a cancel, be it that of another call.
-                if self._library.cancels != cancels:
-                    continue
-                if came and not batch and newest >= self._next + _BATCH:
-                    # The service no longer keeps the events with these numbers.
-                    self._next += _BATCH
-                    continue
-                failed_reads = 0 if came else failed_reads + 1
-                stopping.wait(_PAUSE_AFTER_NOTHING)
+    def _fetch(self) -> None:
+        self._call = self._call_for(self._follower.news)
+        if not self._is_cancelled:
+            with contextlib.suppress(CallCancelled):
+                self._call.result()
 
-    def _read_batch(self) -> tuple[Event, ...]:
-        with TextBuffer() as buffer:
-            return tuple(Event(**fields) for fields in self._library.read(Event, buffer))
+    def _call_for(self, look: Callable[[threading.Event], list[Event | range]]) -> Call[None]:
+        # On the call's thread no signal handler can break it off between reading and keeping.
+        def fetch(stopping: threading.Event) -> None:
+            with self._library.event_turn():
+                self._fetched.extend(look(stopping))
 
-    def _keep_unseen(self, batch: tuple[Event, ...]) -> bool:
-        """Keeps the events of a batch that are new; tells whether there were any."""
-        unseen: dict[int, Event] = {}
-        for event in batch:
-            if event.sequence_number >= self._next:
-                unseen.setdefault(event.sequence_number, event)
-        if unseen:
-            self._next = max(unseen) + 1
-            self._fetched.extend(unseen.values())
-        return bool(unseen)
+        return Call(fetch, self._library.cancel)
 
 
-def check_newest(newest: int, seen: int) -> None:
-    """Raises if the service counts its events anew."""
-    if newest < seen:
-        raise EventLogRestarted(newest, seen)
+def _told(missing: range) -> str:
+    first, last = missing[0], missing[-1]
+    return f"event {first} is missing" if first == last else f"events {first} to {last} are missing"

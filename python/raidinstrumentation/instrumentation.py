@@ -8,7 +8,8 @@ from typing import TypeVar
 from .calls import Call
 from .configuration import read_inventory
 from .errors import ServiceUnavailable
-from .events import LARGEST_NUMBER, EventStream, check_newest
+from .events import EventStream
+from .follower import LARGEST_NUMBER
 from .inventory import Inventory
 from .library import load
 
@@ -89,8 +90,9 @@ class RAIDInstrumentation:
         sequence_number of the last event that was dealt with.
 
         Asks the service for its newest event, so that none is missed between this call and the
-        first next(). Raises ServiceUnavailable as refresh does, and EventLogRestarted if that has a
-        lower number. The timeout is that of this call, not of the stream.
+        first next(). Raises ServiceUnavailable as refresh does. If that has a lower number, looks
+        whether the service still has the event with this number, and raises EventLogRestarted if
+        not. The timeout is that of this call, not of the stream.
         """
         if after is not None and not 0 <= after <= LARGEST_NUMBER:
             raise ValueError(f"event numbers range from 0 to {LARGEST_NUMBER}, unlike {after}")
@@ -98,9 +100,14 @@ class RAIDInstrumentation:
         newest = self._result(Call(library.newest_event, library.cancel), timeout)
         if newest is None:
             raise ServiceUnavailable
-        if after is not None:
-            check_newest(newest, after)
-        stream = EventStream(library, newest if after is None else after + 1)
+        if after is None:
+            stream = EventStream(library, newest, newest or None)
+        elif after == 0:
+            stream = EventStream(library, 0)
+        else:
+            stream = EventStream(library, after + 1, after)
+            if newest < after:
+                self._result(stream.confirmation(), timeout)
         self._streams.add(stream)
         if self._is_closed:
             stream.cancel()

@@ -111,6 +111,16 @@ def test_the_example_goes_on_after_an_outage() -> None:
             interrupt_after_outage(process)
 
 
+def test_the_example_goes_on_when_the_service_counts_anew() -> None:
+    with watching_from_start_to_outage() as process:
+        with Simulator("small-server.xml") as simulator:
+            simulator.event("of another log", sequenceNumber=1)
+            lines_until(process, "of another log")
+            assert process.stderr is not None
+            assert "counts its events anew" in process.stderr.readline()
+            interrupt_after_outage(process)
+
+
 @contextmanager
 def watching_from_start_to_outage() -> Iterator[subprocess.Popen[str]]:
     with Simulator("small-server.xml") as simulator:

@@ -4,11 +4,13 @@ import itertools
 import threading
 from collections.abc import Callable
 from functools import partial
+from logging import WARNING
 from pathlib import Path
 
 import pytest
 from raidinstrumentation import (
     EventLogRestarted,
+    EventStream,
     MalformedAnswer,
     RAIDInstrumentation,
     ServiceUnavailable,
@@ -21,6 +23,10 @@ from support.waiting import PATIENCE
 
 # The answer to a wait is not looked at.
 AWAITED = "there are events"
+
+
+# By what an event says is noticed that the service counts anew.
+SAME_FOR_ALL = "date=2006-10-09T03:12:40Z"
 
 
 def numbers_of(raid: RAIDInstrumentation, after: int | None, count: int) -> list[int]:
@@ -89,14 +95,15 @@ def test_an_event_that_happens_while_it_is_waited_for_comes(raid: RAIDInstrument
             assert next(stream).message_string == "now"
 
 
-def test_events_come_once_in_the_order_of_the_service(raid: RAIDInstrumentation) -> None:
+def test_events_come_once_and_each_batch_by_its_numbers(raid: RAIDInstrumentation) -> None:
     with ScriptedService(
         newest=(newest_event(45),),
         wait=(AWAITED,),
         events=(events(41, 43, 42), events(42, 43, 44, 44, 45)),
     ) as service:
-        assert numbers_of(raid, 40, 5) == [41, 43, 42, 44, 45]
-        assert [">41</as:start>", ">44</as:start>"] == [
+        assert numbers_of(raid, 40, 5) == [41, 42, 43, 44, 45]
+        # With those that are new comes the last one seen.
+        assert [">40</as:start>", ">43</as:start>"] == [
             request[request.index("</as:start>") - 3 :][:14]
             for request in service.requests("events")
         ]
@@ -185,12 +192,12 @@ def test_nothing_is_lost_or_doubled_while_the_service_restarts(
         # while nobody could ask, the other half while it is waited for.
         kept = range(max(1, seen - 10), seen + events_a_life // 2)
         (tmp_path / "log.init").write_text(
-            "".join(f"event sequenceNumber={number}\n" for number in kept)
+            "".join(f"event sequenceNumber={number} {SAME_FOR_ALL}\n" for number in kept)
         )
         with Simulator("small-server.xml", "--init", tmp_path / "log.init") as simulator:
             listens.set()
             for number in range(kept.stop, seen + events_a_life + 1):
-                simulator.event("new", sequenceNumber=number)
+                simulator.command(f"event sequenceNumber={number} {SAME_FOR_ALL}")
             with progress:
                 assert progress.wait_for(lambda: seen + events_a_life in collected, PATIENCE)
 
@@ -211,12 +218,113 @@ def test_nothing_is_lost_or_doubled_while_the_service_restarts(
     assert outages > 0
 
 
+def add(simulator: Simulator, *numbers: int) -> None:
+    """Has a service that counts wrong add events with these numbers."""
+    for number in numbers:
+        simulator.event(f"event {number}", place="last", sequenceNumber=number)
+
+
+def take(stream: EventStream, count: int) -> list[int]:
+    return [next(stream).sequence_number for _ in range(count)]
+
+
+def test_events_in_disorder_all_come(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2, 3)
+        stream = raid.events(0)
+        assert take(stream, 3) == [1, 2, 3]
+        add(simulator, 50, 4)
+        assert take(stream, 2) == [4, 50]
+
+
+def test_an_event_that_comes_late_comes_all_the_same(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2, 3, 50)
+        stream = raid.events(0)
+        assert take(stream, 4) == [1, 2, 3, 50]
+        add(simulator, 4)
+        assert take(stream, 1) == [4]
+        simulator.event("the service counts from the late one on")
+        assert take(stream, 1) == [5]
+        assert stream.missing == (range(6, 50),)
+
+
+def test_an_event_far_below_the_last_one_comes(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2, 3, 500)
+        stream = raid.events(0)
+        assert take(stream, 4) == [1, 2, 3, 500]
+        add(simulator, 4, 5)
+        assert take(stream, 2) == [4, 5]
+        add(simulator, 501)
+        assert take(stream, 1) == [501]
+
+
+def test_what_went_missing_is_asked_for_again_when_more_comes(raid: RAIDInstrumentation) -> None:
+    with ScriptedService(
+        newest=(newest_event(5), newest_event(5), newest_event(7)),
+        wait=(AWAITED,),
+        events=(events(5), events(7), events(6, 7)),
+    ) as service:
+        assert take(raid.events(), 3) == [5, 7, 6]
+        assert ">6</as:start>" in service.requests("events")[-1]
+
+
+def test_numbers_that_are_passed_over_are_told_before_the_event_behind_them(
+    raid: RAIDInstrumentation, caplog: pytest.LogCaptureFixture
+) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 3, 5, 9)
+        stream = raid.events(2)
+        assert take(stream, 1) == [3]
+        assert caplog.record_tuples == []
+        assert take(stream, 1) == [5]
+        assert caplog.record_tuples == [("raidinstrumentation", WARNING, "event 4 is missing")]
+        assert take(stream, 1) == [9]
+        assert caplog.messages[1:] == ["events 6 to 8 are missing"]
+        assert stream.missing == (range(4, 5), range(6, 9))
+
+
+def test_what_the_service_no_longer_keeps_is_missing_only_after_a_number(
+    raid: RAIDInstrumentation,
+) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 7)
+        from_the_oldest, resumed = raid.events(0), raid.events(4)
+        assert take(from_the_oldest, 1) == take(resumed, 1) == [7]
+        assert from_the_oldest.missing == ()
+        assert resumed.missing == (range(5, 7),)
+
+
+def test_more_numbers_than_are_asked_for_at_once_are_passed_over(
+    raid: RAIDInstrumentation,
+) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2)
+        stream = raid.events(0)
+        assert take(stream, 2) == [1, 2]
+        add(simulator, 500)
+        assert take(stream, 1) == [500]
+        assert stream.missing == (range(3, 500),)
+
+
+def test_another_event_with_a_number_that_was_seen_comes(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2, 3)
+        stream = raid.events(0)
+        assert take(stream, 3) == [1, 2, 3]
+        simulator.event("another", place="last", sequenceNumber=2)
+        assert next(stream).message_string == "another"
+        add(simulator, 4)
+        assert take(stream, 1) == [4]
+
+
 def test_a_log_that_began_anew_is_told(raid: RAIDInstrumentation) -> None:
     with Simulator("small-server.xml") as simulator:
         simulator.event("first")
         simulator.event("second")
         stream = raid.events(0)
-        assert [next(stream).sequence_number for _ in range(2)] == [1, 2]
+        assert take(stream, 2) == [1, 2]
     with Simulator("small-server.xml") as simulator:
         simulator.event("first of another log")
         with pytest.raises(EventLogRestarted) as told:
@@ -225,6 +333,104 @@ def test_a_log_that_began_anew_is_told(raid: RAIDInstrumentation) -> None:
         with pytest.raises(EventLogRestarted):
             raid.events(2)
         assert next(raid.events(0)).message_string == "first of another log"
+
+
+def test_after_a_new_count_comes_all_that_was_not_seen(raid: RAIDInstrumentation) -> None:
+    with ScriptedService(
+        newest=(newest_event(3), newest_event(3), newest_event(2)),
+        wait=(AWAITED,),
+        events=(events(2, 3), events(2, message="another"), events(1, 2, message="another")),
+    ):
+        stream = raid.events(0)
+        assert take(stream, 2) == [2, 3]
+        with pytest.raises(EventLogRestarted):
+            next(stream)
+        assert [next(stream).message_string for _ in range(2)] == ["another 1", "another 2"]
+
+
+def test_a_new_count_is_noticed_when_it_has_caught_up(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2)
+        stream = raid.events(0)
+        assert take(stream, 2) == [1, 2]
+    with Simulator("small-server.xml") as simulator:
+        for _ in range(3):
+            simulator.event("of another log")
+        with pytest.raises(EventLogRestarted) as told:
+            next(stream)
+        assert (told.value.newest, told.value.seen) == (3, 2)
+        assert take(stream, 3) == [1, 2, 3]
+
+
+def test_a_new_count_is_noticed_after_an_outage(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1)
+        stream = raid.events(0)
+        assert take(stream, 1) == [1]
+        with meanwhile(simulator.wait_for_waiting_client, simulator.kill):
+            with pytest.raises(ServiceUnavailable):
+                next(stream)
+    with Simulator("small-server.xml") as simulator:
+        simulator.event("of another log")
+        with pytest.raises(EventLogRestarted):
+            next(stream)
+        assert next(stream).message_string == "of another log"
+
+
+def test_a_new_count_is_noticed_before_the_first_event_came(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 7)
+        stream = raid.events()
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1)
+        with pytest.raises(EventLogRestarted):
+            next(stream)
+        assert take(stream, 1) == [1]
+
+
+def test_a_service_that_has_lost_all_events_counts_anew(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2)
+        stream = raid.events(0)
+        assert take(stream, 2) == [1, 2]
+        simulator.command("forget")
+        with pytest.raises(EventLogRestarted):
+            raid.events(2)
+        with pytest.raises(EventLogRestarted):
+            next(stream)
+        simulator.event("new")
+        assert next(stream).message_string == "new"
+
+
+def test_an_answer_without_the_newest_number_is_no_new_count(raid: RAIDInstrumentation) -> None:
+    with ScriptedService(
+        newest=(newest_event(2), newest_event(2), newest_event("?"), newest_event(3)),
+        wait=(AWAITED,),
+        events=(events(2), events(2, 3)),
+    ):
+        assert take(raid.events(), 2) == [2, 3]
+
+
+def test_a_service_that_has_lost_its_last_events_counts_on(raid: RAIDInstrumentation) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 1, 2, 3)
+        stream = raid.events(0)
+        assert take(stream, 3) == [1, 2, 3]
+        simulator.command("forget 1")
+        happen = (simulator.wait_for_waiting_client, lambda: simulator.event("new"))
+        with meanwhile(*happen):
+            event = next(stream)
+        assert (event.sequence_number, event.message_string) == (2, "new")
+
+
+def test_a_stream_resumes_after_an_event_with_a_higher_number_than_the_newest(
+    raid: RAIDInstrumentation,
+) -> None:
+    with Simulator("small-server.xml") as simulator:
+        add(simulator, 50, 4)
+        stream = raid.events(50)
+        add(simulator, 51)
+        assert take(stream, 1) == [51]
 
 
 def test_a_second_thread_cannot_wait(raid: RAIDInstrumentation) -> None:

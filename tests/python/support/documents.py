@@ -24,10 +24,10 @@ def newest_event(number: object) -> str:
     return _response("getNewestEventResponse", _element("as:return", "xsd:int", number))
 
 
-def events(*numbers: int) -> str:
+def events(*numbers: int, message: str = "event") -> str:
     """The answer that holds events with these numbers."""
     listed = (
-        _complex("event", "o:Event", _simple(sequenceNumber=number, string=f"event {number}"))
+        _complex("event", "o:Event", _simple(sequenceNumber=number, string=f"{message} {number}"))
         for number in numbers
     )
     return _response("getEventsResponse", _complex("events", "o:Events", "".join(listed)))
