@@ -24,8 +24,6 @@ class Follower:
     def __init__(self, library: Library, continuity: Continuity) -> None:
         self._library = library
         self._continuity = continuity
-        # A newest number below the last one seen that means nothing.
-        self._trusted: int | None = None
         # For events that are missing or, after an outage, for one that was seen.
         self._looks_back = False
         self._failed_reads = 0
@@ -50,13 +48,7 @@ class Follower:
     def _look(self, stopping: threading.Event) -> list[Event | range] | None:
         """One question to the service and what it brings; None without an answer."""
         newest = self._newest(stopping)
-        seen = self._continuity.last
-        went_back = seen is not None and newest < seen
-        if went_back and newest == self._trusted:
-            # A wait for what is above the last one would miss what the service counts from here.
-            self._pause(stopping)
-            return []
-        if went_back and newest == 0:
+        if newest == 0 and self._continuity.last is not None:
             self._doubt_emptiness(stopping)
             return None
         first = self._first_asked(newest)
@@ -88,7 +80,7 @@ class Follower:
         be waited for in vain."""
         newest = self._library.newest_event(stopping)
         if newest is None:
-            self._doubt()
+            self._looks_back = True
             self._failed_reads = 0
             raise ServiceUnavailable
         if self._failed_reads == _MALFORMED_READS:
@@ -101,6 +93,7 @@ class Follower:
         seen = continuity.last
         if seen is not None:
             if newest < seen:
+                # A wait for what is above the last one would miss what the service counts from here.
                 return continuity.around(newest)
             if newest > seen or self._looks_back:
                 return continuity.overlapping()
@@ -112,7 +105,7 @@ class Follower:
             self._failed_reads = 0
             with TextBuffer() as buffer:
                 return tuple(Event(**fields) for fields in self._library.read(Event, buffer))
-        self._doubt()
+        self._looks_back = True
         # That nothing came tells nothing after a cancel, be it that of another call.
         if self._library.cancels == cancels:
             self._failed_reads += 1
@@ -130,23 +123,15 @@ class Follower:
             self._begin_anew(newest)
         elif went_back and batch:
             greatest = max(event.sequence_number for event in batch)
+            # Otherwise the events are only in disorder.
             if greatest < seen:
                 self._continuity.shrink_to(greatest)
-            else:
-                # The events are only in disorder.
-                self._trusted = newest
-
-    def _doubt(self) -> None:
-        """The service may not be the same any more."""
-        self._trusted = None
-        self._looks_back = True
 
     def _begin_anew(self, newest: int) -> NoReturn:
         """The service counts anew: everything that it has is asked for next."""
         seen = self._continuity.last
         assert seen is not None
         self._continuity.begin_anew()
-        self._trusted = None
         raise EventLogRestarted(newest, seen)
 
     def _pause(self, stopping: threading.Event) -> None:
