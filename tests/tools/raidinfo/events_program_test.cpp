@@ -12,6 +12,7 @@
 #include "documents.h"
 #include "program.h"
 #include "scripted.h"
+#include "simulator.h"
 
 namespace raidinfo::test {
 namespace {
@@ -215,6 +216,20 @@ TEST(EventsCommand, EndsAfterAsManyEventsAsWereAskedFor) {
     EXPECT_THAT(numbers(result.output), ElementsAre(5, 6));
     EXPECT_EQ(result.status, 0);
     EXPECT_THAT(service.request(2), HasSubstr(">5</as:start>"));
+}
+
+// The read behind the last event shown holds nothing but that, and the next one a hundred further.
+TEST(EventsCommand, PassesOverAGapThatIsLongerThanWhatIsAskedForAtOnce) {
+    Simulator simulator{"small-server.xml"};
+    for (int number = 1; number <= 5; ++number) {
+        simulator.command("event string=early");
+    }
+    simulator.command("event sequenceNumber=300");
+    simulator.command("event sequenceNumber=500");
+    const Result result = run({"events", "--json", "--since", "1", "--count", "7"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(1, 2, 3, 4, 5, 300, 500));
+    EXPECT_EQ(result.errors,
+              "raidinfo: events 6 to 299 are missing\nraidinfo: events 301 to 499 are missing\n");
 }
 
 TEST(EventsCommand, TellsAGapBeforeTheEventBehindIt) {

@@ -107,6 +107,9 @@ Continuity::History Continuity::compared(const Records& batch) const {
     std::map<std::int64_t, bool> isThere;  // by the numbers that were shown: any event that was
     for (const Record& event : batch) {
         const Event looked{numberOf(event), contentOf(event)};
+        if (looked.first > greatest.value_or(0)) {
+            continue;  // It may be one of those that the service has lost and now counts again.
+        }
         for (auto known = shown.lower_bound({looked.first, 0});
              known != shown.end() && known->first.first == looked.first; ++known) {
             if (known->second == count) {

@@ -72,6 +72,7 @@ private:
         if (isAway) {
             isAway = false;
             trusted = -1;
+            mayBeLate = true;  // It may be another one, or have begun to count anew.
             backoff.reset();
             listener.notice({"service_available", "the RAID management service answers again"});
         }
@@ -119,11 +120,12 @@ private:
     }
 
     Records readFrom(std::int64_t number, const std::stop_token& stop) {
-        emptinessIsNew = *batch == nullptr || published > 0;
+        const bool wasThere = *batch != nullptr;
         setNext(static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max())));
         waitForEvents();
         Records records = stop.stop_requested() ? Records{} : reader.read(eventKind());
-        published = records.size();
+        readIsNew = !wasThere || records != published;
+        published = records;
         return records;
     }
 
@@ -163,7 +165,7 @@ private:
             mayBeLate = continuity->waitsForLateEvents();
         } else if (continuity->next() > before) {
             failedReads = 0;  // Shown before the service lost them, and now there again.
-        } else if (newest >= behind && records.empty() && *batch != nullptr) {
+        } else if (newest >= behind && greatestNumber(records) < before && *batch != nullptr) {
             passOver(behind, stop);
         } else {
             examineReadOfNothing(stop);
@@ -171,10 +173,11 @@ private:
         return more;
     }
 
-    /// The range that was read holds nothing, if it was read: a wait that fails publishes what was
-    /// published before. Where that was nothing, too, something is read and then the range again.
+    /// The range that was read holds nothing new, if it was read: a wait that fails publishes what
+    /// was published before. Where that was the same, something else is read and then the range
+    /// again.
     void passOver(std::int64_t behind, const std::stop_token& stop) {
-        if (emptinessIsNew) {
+        if (readIsNew) {
             continuity->passOverTo(behind);
         } else if (readFrom(newest, stop).empty()) {
             examineReadOfNothing(stop);
@@ -201,11 +204,11 @@ private:
     StreamStart beginning;
     std::optional<Continuity> continuity;  ///< from the first answer on
     Backoff backoff;
-    std::int64_t newest = 0;     ///< when the service was asked last
-    std::int64_t trusted = -1;   ///< a newest number below the last shown that means nothing
-    bool mayBeLate = false;      ///< a look for events that are missing is due
-    std::size_t published = 0;   ///< by the library, after the last read
-    bool emptinessIsNew = true;  ///< an empty batch would not be what was there before the read
+    std::int64_t newest = 0;    ///< when the service was asked last
+    std::int64_t trusted = -1;  ///< a newest number below the last shown that means nothing
+    bool mayBeLate = false;     ///< a look for events that are missing is due
+    Records published;          ///< by the library, after the last read
+    bool readIsNew = true;      ///< it was not published before that already
     int failedReads = 0;
     bool isAway = false;
 };

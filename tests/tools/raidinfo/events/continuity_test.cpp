@@ -57,6 +57,15 @@ TEST(Continuity, TakesTwoEventsOfOneNumberForTheSameHistory) {
         << "one more of this number is only new";
 }
 
+TEST(Continuity, AwaitsOtherEventsWithTheNumbersOfThoseThatTheServiceHasLost) {
+    Continuity continuity{1};
+    static_cast<void>(continuity.accept({event(1, "a"), event(2, "b")}));
+    continuity.shrinkTo(1);
+    const Records again{event(1, "a"), event(2, "c")};
+    EXPECT_EQ(continuity.compared(again), Continuity::History::same);
+    EXPECT_THAT(shownEvents(continuity, again), ElementsAre(2));
+}
+
 TEST(Continuity, DoesNotHoldTheEventsOfTheCountBeforeAgainstThoseOfANewOne) {
     Continuity continuity{1};
     static_cast<void>(continuity.accept({event(1, "old"), event(2, "old"), event(3, "same")}));
