@@ -117,11 +117,12 @@ int refuse(const Failure& failure, std::span<const char* const> arguments, const
         });
     };
     complain(failure.what());
+    if (isThere("health") && isThere("--nagios")) {
+        return tellMonitoring(failure, output);
+    }
     if (isThere("--json")) {
         output.write(documentLine(
             enveloped({"none", ""}, {{troubleCode(failure.status()), failure.what()}}, nullptr)));
-    } else if (isThere("health") && isThere("--nagios")) {
-        return tellMonitoring(failure, output);
     }
     return static_cast<int>(failure.status());
 }

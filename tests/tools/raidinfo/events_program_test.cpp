@@ -195,18 +195,17 @@ TEST(EventsCommand, HandsNothingOutWhenItCannotKeepAccount) {
 
 TEST(EventsCommand, PassesOverNumbersThatTheServiceNoLongerHas) {
     const Connection nothing = answering(eventBatch({}));
-    // The second empty batch could be the first one, published again. So it reads something and
-    // then looks again.
+    const Connection last = answering(eventBatch({299, 300}));
+    // When they have come, those that went missing last are looked for once more.
     const ScriptedService service{{newest(300), awaited(), nothing, newest(300), awaited(), nothing,
-                                   awaited(), answering(eventBatch({300})), newest(300), awaited(),
-                                   nothing, newest(300), awaited(),
-                                   answering(eventBatch({299, 300})), newest(300), waiting}};
+                                   newest(300), awaited(), last, newest(300), awaited(), last,
+                                   newest(300), waiting}};
     Program program{raidinfo({"events", "--json", "--since", "1"})};
-    const Result result = interrupt(program, service, 15);
+    const Result result = interrupt(program, service, 13);
     EXPECT_THAT(numbers(result.output), ElementsAre(299, 300));
     EXPECT_THAT(service.request(5), HasSubstr(">102</as:start>"));
-    EXPECT_THAT(service.request(10), HasSubstr(">102</as:start>"));
-    EXPECT_THAT(service.request(13), HasSubstr(">203</as:start>"));
+    EXPECT_THAT(service.request(8), HasSubstr(">203</as:start>"));
+    EXPECT_THAT(service.request(11), HasSubstr(">201</as:start>"));
     EXPECT_THAT(result.errors, HasSubstr("events 1 to 298 are missing"));
 }
 
@@ -216,6 +215,26 @@ TEST(EventsCommand, EndsAfterAsManyEventsAsWereAskedFor) {
     EXPECT_THAT(numbers(result.output), ElementsAre(5, 6));
     EXPECT_EQ(result.status, 0);
     EXPECT_THAT(service.request(2), HasSubstr(">5</as:start>"));
+}
+
+TEST(EventsCommand, BeginsWithTheOldestEventWhateverItsNumber) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event sequenceNumber=500 string=oldest\nevent string=second");
+    const Result result = run({"events", "--json", "--since", "0", "--count", "2"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(500, 501));
+    EXPECT_EQ(result.errors, "");
+}
+
+// It counts anew and has come as far, before anybody has noticed that it was away.
+TEST(EventsCommand, NoticesAServiceThatWasRestartedQuickly) {
+    const ScriptedService service{{newest(3), awaited(), answering(eventBatch({1, 2, 3})),
+                                   newest(3), failing, failing, newest(3), awaited(),
+                                   answering(otherEventBatch({3})), newest(3), awaited(),
+                                   answering(otherEventBatch({1, 2, 3})), newest(3), waiting}};
+    Program program{raidinfo({"events", "--json", "--since", "1"})};
+    const Result result = interrupt(program, service, 13);
+    EXPECT_THAT(numbers(result.output), ElementsAre(1, 2, 3, 1, 2, 3));
+    EXPECT_THAT(result.errors, HasSubstr("it has begun to count anew"));
 }
 
 // The read behind the last event shown holds nothing but that, and the next one a hundred further.

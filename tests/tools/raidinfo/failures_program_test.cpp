@@ -163,6 +163,7 @@ TEST(FailingProgram, RefusesAWrongCommandLineAlsoWhereItHasStatusesOfItsOwn) {
     EXPECT_EQ(result.status, 3);
     EXPECT_THAT(result.output, MatchesRegex("RAID UNKNOWN - [^\n]*--bogus[^\n]*\n"));
     EXPECT_THAT(result.errors, HasSubstr("--bogus"));
+    EXPECT_EQ(run({"health", "--nagios", "--json"}).status, 3);
     expectFailure(run({"health", "--bogus"}), 64, "--bogus");
     expectFailure(run({"diff"}), 64, "before");
 }

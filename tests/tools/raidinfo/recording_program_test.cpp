@@ -87,6 +87,23 @@ TEST_F(Recording, ShowsWhatTheServiceShowedWithoutIt) {
     EXPECT_EQ(dataOf(run(from({"events", "--json"})))["message_string"], "Drive & failed");
 }
 
+// The question for the events is cancelled, and the one behind it answered.
+TEST_F(Recording, FailsWhenOneOfItsFirstAnswersDoesNotComeInTime) {
+    const ScriptedService service{{answering(newestEventDocument("1")),
+                                   Connection{.end = End::hold},
+                                   answering(configuration(sampleAdapter()))}};
+    const Result result = run({"record", "--timeout", "1", file});
+    EXPECT_EQ(result.status, 69);
+    EXPECT_THAT(result.errors, HasSubstr("--timeout"));
+}
+
+TEST_F(Recording, SaysThatNothingCameInTheTimeToRecord) {
+    const ScriptedService service{{Connection{.end = End::hold}, Connection{}, Connection{}}};
+    const Result result = run({"record", "--for", "1", file});
+    EXPECT_EQ(result.status, 69);
+    EXPECT_THAT(result.errors, HasSubstr("within the --for"));
+}
+
 TEST_F(Recording, IsPrintedWhereItsFileIsTheStandardOutput) {
     const Simulator simulator{"small-server.xml"};
     const Result result = run({"record", "--for", "0", "-", "--json"});

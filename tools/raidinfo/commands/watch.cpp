@@ -119,8 +119,7 @@ private:
 
     /// Until something happens or the interval is over.
     void waitForEvents() {
-        const std::int64_t next = std::min<std::int64_t>(newestSeen + 1, largestNumber);
-        session.library().function<void(int)>("setRAIDEventSequenceNumber")(static_cast<int>(next));
+        session.library().function<void(int)>("setRAIDEventSequenceNumber")(nextNumber());
         bool inTime = false;
         {
             const Alarm alarm{options.interval,
@@ -135,6 +134,15 @@ private:
         if (idleWaits > 1) {
             pauseUnlessStopped(options.interval, session.stop());
         }
+    }
+
+    /// What came while the inventory was read is told, too.
+    [[nodiscard]] int nextNumber() const {
+        std::int64_t next = newestSeen + 1;
+        if (continuity && newestSeen >= continuity->last().value_or(0)) {
+            next = std::min(next, std::max<std::int64_t>(continuity->next(), 1));
+        }
+        return static_cast<int>(std::min<std::int64_t>(next, std::numeric_limits<int>::max()));
     }
 
     /// Keeps the last ones for the picture; returns whether there were any.
@@ -157,8 +165,6 @@ private:
         }
         return !fresh.empty();
     }
-
-    static constexpr std::int64_t largestNumber = std::numeric_limits<int>::max();
 
     const Session& session;
     const WatchOptions& options;

@@ -7,6 +7,7 @@
 #include <sys/socket.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <array>
 #include <cerrno>
 #include <filesystem>
@@ -170,13 +171,14 @@ void examine(const Library& library, std::optional<std::chrono::milliseconds> li
     const auto begun = Clock::now();
     const Examined service = listening(limit);
     const auto passed = std::chrono::floor<std::chrono::milliseconds>(Clock::now() - begun);
-    if (limit && passed >= *limit) {
+    if (limit && passed >= *limit && service.outcome == Outcome::bad) {
         tell(service);
         return;
     }
     std::optional<Alarm> alarm;
     if (limit) {
-        alarm.emplace(*limit - passed, library.function<void()>("cancelGetEvent"));
+        alarm.emplace(std::max(*limit - passed, Limit::value_type{1}),
+                      library.function<void()>("cancelGetEvent"));
     }
     const std::stop_token over = alarm ? alarm->over() : std::stop_token{};
     // The library reads its settings with the first exchange.

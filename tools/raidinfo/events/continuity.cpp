@@ -144,8 +144,12 @@ std::int64_t Continuity::overlapping() const {
     if (!greatest || asked > expected) {
         return next();
     }
-    const auto recent = missingUntil.lower_bound(*greatest - overlap);
-    return recent == missingUntil.end() ? *greatest : std::min(recent->first, *greatest);
+    const std::int64_t lowest = std::max<std::int64_t>(*greatest - overlap, 1);
+    const auto above = missingUntil.upper_bound(lowest);
+    if (above != missingUntil.begin() && std::prev(above)->second >= lowest) {
+        return lowest;
+    }
+    return above == missingUntil.end() ? *greatest : std::min(above->first, *greatest);
 }
 
 /// An event with the number of another one that was shown is new when it says something else.

@@ -6,6 +6,7 @@
 #include <optional>
 #include <string>
 
+#include "events/wait.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
 #include "system/backoff.h"
@@ -27,13 +28,10 @@ std::string told(const MissingNumbers& missing) {
 class Follower {
 public:
     Follower(const Library& library, const StreamStart& start, const EventListener& told)
-        : reader{library},
+        : wait{library},
           askNewest{library.function<int()>("enableRAIDEvent")},
           nextNumber{library.variable<int>("nextSequenceNumber")},
-          setNext{library.function<void(int)>("setRAIDEventSequenceNumber")},
-          waitForEvents{library.function<int()>("getEvent")},
           cancel{library.function<void()>("cancelGetEvent")},
-          batch{library.variable<const void*>("raidEvents")},
           listener{told},
           beginning{start} {}
 
@@ -47,13 +45,20 @@ public:
         const bool isAhead = last && (newest > *last || mayBeLate);
         const std::int64_t from =
             wentBack ? newest : (isAhead ? continuity->overlapping() : continuity->next());
-        mayBeLate = false;
-        const Records records = readFrom(from, stop);
-        if (stop.stop_requested() ||
-            (last && from <= *last && !isContinued(records, wentBack, *last, stop))) {
+        const Awaited awaited = wait.from(from);
+        if (stop.stop_requested()) {
             return true;
         }
-        return show(records, from, stop);
+        if (awaited.outcome != Awaited::Outcome::read) {
+            examineFailure(awaited.outcome, stop);
+            return true;
+        }
+        failedReads = 0;
+        mayBeLate = false;
+        if (last && from <= *last && !isContinued(awaited.events, wentBack, *last, stop)) {
+            return true;
+        }
+        return show(awaited.events, from, stop);
     }
 
 private:
@@ -119,16 +124,6 @@ private:
         backoff.wait(stop);
     }
 
-    Records readFrom(std::int64_t number, const std::stop_token& stop) {
-        const bool wasThere = *batch != nullptr;
-        setNext(static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max())));
-        waitForEvents();
-        Records records = stop.stop_requested() ? Records{} : reader.read(eventKind());
-        readIsNew = !wasThere || records != published;
-        published = records;
-        return records;
-    }
-
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to
     /// count anew, and what it has is asked for from the beginning.
     bool isContinued(const Records& records, bool wentBack, std::int64_t last,
@@ -160,46 +155,34 @@ private:
         const bool more = showBatch(*continuity, records, watched);
         const std::int64_t behind = from + numbersAsked;
         if (anyFresh) {
-            failedReads = 0;
             backoff.reset();
             mayBeLate = continuity->waitsForLateEvents();
-        } else if (continuity->next() > before) {
-            failedReads = 0;  // Shown before the service lost them, and now there again.
-        } else if (newest >= behind && greatestNumber(records) < before && *batch != nullptr) {
-            passOver(behind, stop);
-        } else {
-            examineReadOfNothing(stop);
+        } else if (continuity->next() == before) {
+            // Otherwise they were shown before the service lost them, and are there again.
+            if (newest >= behind && (records.empty() || greatestNumber(records) < before)) {
+                continuity->passOverTo(behind);
+            } else {
+                backoff.wait(stop);
+            }
         }
         return more;
     }
 
-    /// The range that was read holds nothing new, if it was read: a wait that fails publishes what
-    /// was published before. Where that was the same, something else is read and then the range
-    /// again.
-    void passOver(std::int64_t behind, const std::stop_token& stop) {
-        if (readIsNew) {
-            continuity->passOverTo(behind);
-        } else if (readFrom(newest, stop).empty()) {
-            examineReadOfNothing(stop);
-        }
-    }
-
-    /// Fails if nothing new comes because of malformed answers; an empty batch is none.
-    void examineReadOfNothing(const std::stop_token& stop) {
-        failedReads = *batch == nullptr ? failedReads + 1 : 0;
+    /// Whoever answers next may be another service, or the same that counts anew.
+    void examineFailure(Awaited::Outcome outcome, const std::stop_token& stop) {
+        failedReads = outcome == Awaited::Outcome::malformed ? failedReads + 1 : 0;
         if (failedReads == malformedReads) {
             throw malformedAnswer();
         }
+        trusted = -1;
+        mayBeLate = true;
         backoff.wait(stop);
     }
 
-    RecordReader reader;
+    EventWait wait;
     int (*askNewest)();
     const int* nextNumber;  ///< the library's, which askNewest sets to the newest
-    void (*setNext)(int);
-    int (*waitForEvents)();
     void (*cancel)();
-    const void* const* batch;  ///< the library's: null after a malformed answer
     const EventListener& listener;
     StreamStart beginning;
     std::optional<Continuity> continuity;  ///< from the first answer on
@@ -207,8 +190,6 @@ private:
     std::int64_t newest = 0;    ///< when the service was asked last
     std::int64_t trusted = -1;  ///< a newest number below the last shown that means nothing
     bool mayBeLate = false;     ///< a look for events that are missing is due
-    Records published;          ///< by the library, after the last read
-    bool readIsNew = true;      ///< it was not published before that already
     int failedReads = 0;
     bool isAway = false;
 };

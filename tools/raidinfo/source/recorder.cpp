@@ -165,8 +165,12 @@ void recordAnswers(const Library& library, const EntrySink& sink, const Recordin
         ofFirstAnswer.emplace(*time.firstAnswer, end);
     }
     Recorder recorder{library, sink, over.get_token()};
-    if (!recorder.recordAll()) {
-        throw over.stop_requested() ? noAnswerInTime() : serviceUnavailable();
+    const bool isAnswered = recorder.recordAll();
+    if (ofFirstAnswer && ofFirstAnswer->over().stop_requested() && !stop.stop_requested()) {
+        throw noAnswerInTime();  // Some of it may be there.
+    }
+    if (!isAnswered) {
+        throw over.stop_requested() ? noAnswerInTime("--for") : serviceUnavailable();
     }
     ofFirstAnswer.reset();
     if (endsAtOnce) {

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <string>
+
 #include "exit_status.h"
 #include "source/service_address.h"
 
@@ -10,9 +12,9 @@ namespace raidinfo {
             "the RAID management service on " + ServiceAddress::inWords() + " does not answer"};
 }
 
-[[nodiscard]] inline Failure noAnswerInTime() {
+[[nodiscard]] inline Failure noAnswerInTime(const std::string& option = "--timeout") {
     return {ExitStatus::serviceUnavailable,
-            "the RAID management service gave no answer within the --timeout"};
+            "the RAID management service gave no answer within the " + option};
 }
 
 [[nodiscard]] inline Failure malformedAnswer() {

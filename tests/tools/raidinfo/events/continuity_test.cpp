@@ -179,12 +179,12 @@ TEST(Continuity, AsksForTheLastOneShownAgainAndForWhatIsMissingALittleBelow) {
     EXPECT_EQ(continuity.overlapping(), 3);
     EXPECT_TRUE(continuity.waitsForLateEvents());
     static_cast<void>(continuity.accept(batch({103})));
-    EXPECT_EQ(continuity.overlapping(), 6);
-    static_cast<void>(continuity.accept(batch({104})));
     // From further below, the library would read nothing that is ahead.
+    EXPECT_EQ(continuity.overlapping(), 4);
+    static_cast<void>(continuity.accept(batch({104})));
     EXPECT_EQ(continuity.overlapping(), 6);
     static_cast<void>(continuity.accept(batch({500})));
-    EXPECT_EQ(continuity.overlapping(), 500);
+    EXPECT_EQ(continuity.overlapping(), 401);
 }
 
 TEST(Continuity, AsksNotAgainWhereThereIsNothing) {
