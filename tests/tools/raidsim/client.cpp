@@ -50,10 +50,14 @@ std::string Client::receive() {
     return received;
 }
 
-bool Client::isAnswered() {
-    pollfd look{socket.native_handle(), POLLIN, 0};
+bool Client::isThere(short what) {
+    pollfd look{socket.native_handle(), what, 0};
     return ::poll(&look, 1, 0) != 0;
 }
+
+bool Client::isAnswered() { return isThere(POLLIN); }
+
+bool Client::isAnsweredInFull() { return isThere(POLLRDHUP); }
 
 std::string ask(std::uint16_t port, std::string_view request) {
     Client client(port);

@@ -19,8 +19,12 @@ public:
     [[nodiscard]] std::string receive();
     // Whether anything, be it the end, can be received at this moment.
     [[nodiscard]] bool isAnswered();
+    // Whether the service has sent all that it will.
+    [[nodiscard]] bool isAnsweredInFull();
 
 private:
+    [[nodiscard]] bool isThere(short what);
+
     boost::asio::io_context context;
     boost::asio::ip::tcp::socket socket{context};
 };

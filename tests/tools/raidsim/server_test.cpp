@@ -240,7 +240,7 @@ TEST(Server, LeavesAnAnswerToWhoHasItWhenItGoesDown) {
     RunningService service;
     Client client(service.port());
     client.send(getConfig);
-    while (!client.isAnswered())
+    while (!client.isAnsweredInFull())
         std::this_thread::yield();
     service.command("down");
     EXPECT_THAT(client.receive(), EndsWith("</env:Envelope>\n"));
