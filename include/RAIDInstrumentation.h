@@ -52,8 +52,8 @@
  *     its answer is malformed, the inventory lists keep what they held (nothing, at first). The
  *     exported pointer `raidSystem` (C++, the configuration read last) tells more: it is null when
  *     the last answer was malformed, and what it was before when no answer came. A service that
- *     accepts the connection and then stays silent blocks the caller until cancelGetEvent is called
- *     on another thread. Functions are C++ inside: an exception such as std::bad_alloc may leave
+ *     stays silent, be it that it accepts no connection, blocks the caller until cancelGetEvent is
+ *     called on another thread. Functions are C++ inside: an exception such as std::bad_alloc may leave
  *     the count functions, RAIDinit, enableRAIDEvent and getEvent.
  *
  *  8. Events. Call enableRAIDEvent (start at the newest event) or setRAIDEventSequenceNumber

@@ -62,7 +62,8 @@ constexpr auto subcommands = std::to_array<Subcommand>({
              ->type_name(value_type::filter)
              ->expected(1)
              ->take_all();
-         app.add_flag("--noheadings", words.noHeadings, "Print no titles");
+         app.add_flag("--noheadings", words.noHeadings,
+                      "Print no titles; without KIND, begin each row with its kind");
      },
      [](const CLI::App& app, const Words& words) -> CommandOptions {
          return readList(app, words);
@@ -106,7 +107,8 @@ constexpr auto subcommands = std::to_array<Subcommand>({
              ->check(notEmpty())
              ->take_last();
          addFile(app, "--state", words.state,
-                 "Keep the last number in this file, and go on from there when started again");
+                 "Keep the last number in this file, and go on from there when started again, "
+                 "whatever --since says");
      },
      [](const CLI::App& app, const Words& words) -> CommandOptions {
          return EventsOptions{optionalNumber(app, "--since", words.since),

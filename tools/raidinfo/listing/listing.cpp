@@ -1,26 +1,35 @@
 #include "listing/listing.h"
 
 #include <algorithm>
+#include <iterator>
 #include <map>
 #include <utility>
 
 namespace raidinfo {
 namespace {
 
-/// A record in the tree: its node, and what that belongs to, from the adapter down.
-struct Place {
-    const Node* node;
-    std::vector<const Node*> holders;
-};
+/// What the tree tells of a kind's records, by position.
+using ValuesByPosition = std::map<std::size_t, std::vector<Value>>;
 
-/// The records of a kind by position.
-using Places = std::map<std::size_t, Place>;
+/// The holders are what the node belongs to, from the adapter down.
+Value valueOf(const TreeField& field, const Node& node, const std::vector<const Node*>& holders) {
+    if (field.holder) {
+        // Enclosures stand below channels, and those below adapters.
+        const auto depth = static_cast<std::size_t>(*field.holder);
+        return depth < holders.size() ? Value{holders[depth]->number} : Unknown{};
+    }
+    const auto found = std::ranges::find(node.extras, field.key, &Extras::value_type::first);
+    return found == node.extras.end() ? Unknown{} : found->second;
+}
 
 void gather(const Kind& kind, const Group& group, std::vector<const Node*>& holders,
-            Places& found) {
+            ValuesByPosition& found) {
     for (const Node& node : group.nodes) {
         if (node.kind == &kind && node.inFull && node.position) {
-            found.emplace(*node.position, Place{&node, holders});
+            std::vector<Value>& values = found[*node.position];
+            for (const TreeField& field : kind.fromTree) {
+                values.push_back(valueOf(field, node, holders));
+            }
         }
         holders.push_back(&node);
         for (const Group& below : node.groups) {
@@ -28,17 +37,6 @@ void gather(const Kind& kind, const Group& group, std::vector<const Node*>& hold
         }
         holders.pop_back();
     }
-}
-
-Value valueOf(const Place& place, const TreeField& field) {
-    if (field.holder) {
-        // Enclosures stand below channels, and those below adapters.
-        const auto depth = static_cast<std::size_t>(*field.holder);
-        return depth < place.holders.size() ? Value{place.holders[depth]->number} : Unknown{};
-    }
-    const auto& extras = place.node->extras;
-    const auto found = std::ranges::find(extras, field.key, &Extras::value_type::first);
-    return found == extras.end() ? Unknown{} : found->second;
 }
 
 }  // namespace
@@ -65,10 +63,10 @@ std::string withoutColumn(const Kind& kind, std::string_view key) {
 }
 
 Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees) {
-    Places places;
+    ValuesByPosition fromTree;
     if (!kind.fromTree.empty()) {
         std::vector<const Node*> holders;
-        gather(kind, trees, holders, places);
+        gather(kind, trees, holders, fromTree);
     }
     Listing listing{&kind, columnsOf(kind), {}};
     const Records& records = snapshot.of(kind.id);
@@ -77,10 +75,9 @@ Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees
         std::vector<Value>& row = listing.rows.emplace_back();
         row.reserve(listing.columns.size());
         row.emplace_back(static_cast<int>(position));
-        const auto place = places.find(position);
-        for (const TreeField& field : kind.fromTree) {
-            row.push_back(place == places.end() ? Unknown{} : valueOf(place->second, field));
-        }
+        std::vector<Value>& known = fromTree[position];
+        known.resize(kind.fromTree.size(), Unknown{});
+        std::ranges::move(known, std::back_inserter(row));
         row.insert(row.end(), records[position].begin(), records[position].end());
     }
     return listing;
