@@ -1,4 +1,3 @@
-#include <optional>
 #include <stop_token>
 
 #include "commands/commands.h"
@@ -24,11 +23,9 @@ health::Verdict verdictOf(const Session& session, const HealthOptions& options,
     const CodeBook& book = session.codeBook();
     const health::Policy policy =
         options.policy ? health::readPolicy(*options.policy, book) : health::defaultPolicy(book);
-    std::optional<Alarm> alarm;
-    if (const auto limit = session.options().limitOf(Limited::answer)) {
-        alarm.emplace(*limit, session.library().function<void()>("cancelGetEvent"));
-    }
-    const std::stop_token over = alarm ? alarm->over() : session.stop();
+    const Alarm alarm{session.options().limitOf(Limited::answer),
+                      session.library().function<void()>("cancelGetEvent")};
+    const std::stop_token over = alarm.over();
     try {
         return health::judge(session.inventory(over).adapters(), policy, book);
     } catch (const Failure& thrown) {

@@ -1,6 +1,5 @@
 #include <algorithm>
 #include <cstdint>
-#include <limits>
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <string>
@@ -9,6 +8,7 @@
 #include "commands/commands.h"
 #include "events/event_line.h"
 #include "events/follower.h"
+#include "events/wait.h"
 #include "exit_status.h"
 #include "json/json.h"
 #include "source/service_failures.h"
@@ -29,7 +29,7 @@ public:
           options{chosen},
           askNewest{watched.library().function<int()>("enableRAIDEvent")},
           newest{watched.library().variable<int>("nextSequenceNumber")},
-          reader{watched.library()} {
+          wait{watched.library()} {
         if (!watched.options().json) {
             screen.emplace(watched.output(), watched.options().color);
         }
@@ -49,11 +49,9 @@ public:
 private:
     /// Reads and shows the inventory; what is shown stays where the service does not answer.
     bool look() {
-        std::optional<Alarm> alarm;
-        if (const auto limit = session.options().limitOf(Limited::answer); limit && !everShown) {
-            alarm.emplace(*limit, session.library().function<void()>("cancelGetEvent"));
-        }
-        const std::stop_token over = alarm ? alarm->over() : session.stop();
+        const Alarm alarm{everShown ? std::nullopt : session.options().limitOf(Limited::answer),
+                          session.library().function<void()>("cancelGetEvent")};
+        const std::stop_token over = alarm.over();
         if (askNewest() == 0) {
             return lost(over.stop_requested() ? noAnswerInTime() : serviceUnavailable());
         }
@@ -119,15 +117,14 @@ private:
 
     /// Until something happens or the interval is over.
     void waitForEvents() {
-        session.library().function<void(int)>("setRAIDEventSequenceNumber")(nextNumber());
+        bool isNew = false;
         bool inTime = false;
         {
             const Alarm alarm{options.interval,
                               session.library().function<void()>("cancelGetEvent")};
-            session.library().function<int()>("getEvent")();
+            isNew = tellEvents(wait.from(nextNumber()).events);
             inTime = !alarm.over().stop_requested();
         }
-        const bool isNew = tellEvents(reader.read(eventKind()));
         // A service whose newest event has a lower number than others, or that fails, ends each
         // wait at once.
         idleWaits = inTime && !isNew ? idleWaits + 1 : 0;
@@ -137,12 +134,10 @@ private:
     }
 
     /// What came while the inventory was read is told, too.
-    [[nodiscard]] int nextNumber() const {
-        std::int64_t next = newestSeen + 1;
-        if (continuity && newestSeen >= continuity->last().value_or(0)) {
-            next = std::min(next, std::max<std::int64_t>(continuity->next(), 1));
-        }
-        return static_cast<int>(std::min<std::int64_t>(next, std::numeric_limits<int>::max()));
+    [[nodiscard]] std::int64_t nextNumber() const {
+        const std::int64_t next = newestSeen + 1;
+        const bool isCounting = continuity && newestSeen >= continuity->last().value_or(0);
+        return isCounting ? std::min(next, std::max<std::int64_t>(continuity->next(), 1)) : next;
     }
 
     /// Keeps the last ones for the picture; returns whether there were any.
@@ -171,7 +166,7 @@ private:
     std::optional<Screen> screen;  ///< none for JSON
     int (*askNewest)();
     const int* newest;
-    RecordReader reader;
+    EventWait wait;
     Backoff backoff;
     std::vector<TreeLine> lines;
     std::vector<ScreenLine> lastEvents;

@@ -175,17 +175,13 @@ void examine(const Library& library, std::optional<std::chrono::milliseconds> li
         tell(service);
         return;
     }
-    std::optional<Alarm> alarm;
-    if (limit) {
-        alarm.emplace(std::max(*limit - passed, Limit::value_type{1}),
-                      library.function<void()>("cancelGetEvent"));
-    }
-    const std::stop_token over = alarm ? alarm->over() : std::stop_token{};
+    const Limit left = limit ? Limit{std::max(*limit - passed, Limit::value_type{1})} : limit;
+    const Alarm alarm{left, library.function<void()>("cancelGetEvent")};
     // The library reads its settings with the first exchange.
     const Examined answer = answering(library);
     tell(settings(library));
     tell(log(library));
-    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library, over))) {
+    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library, alarm.over()))) {
         return;
     }
     tell(published(library));

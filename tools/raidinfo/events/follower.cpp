@@ -86,12 +86,9 @@ private:
 
     /// Only the first answer is a matter of patience: later a silent service is waited for.
     [[nodiscard]] bool isAnswering() const {
-        std::optional<Alarm> alarm;
-        if (!continuity && beginning.patience) {
-            alarm.emplace(*beginning.patience, cancel);
-        }
+        const Alarm alarm{continuity ? std::nullopt : beginning.patience, cancel};
         const bool answers = askNewest() != 0;
-        if (!answers && alarm && alarm->over().stop_requested()) {
+        if (!answers && alarm.over().stop_requested()) {
             throw noAnswerInTime();
         }
         return answers;

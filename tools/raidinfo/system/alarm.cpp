@@ -8,18 +8,22 @@
 
 namespace raidinfo {
 
-Alarm::Alarm(std::chrono::milliseconds after, std::function<void()> cancel)
-    : clock{[after, cancel = std::move(cancel), waiting = pthread_self(),
-             source = timeIsOver](const std::stop_token& stop) mutable {
-          pauseUnlessStopped(after, stop);
-          if (!stop.stop_requested()) {
-              source.request_stop();
-          }
-          while (!stop.stop_requested()) {
-              cancel();
-              wake(waiting);
-              pauseUnlessStopped(cancelInterval, stop);
-          }
-      }} {}
+Alarm::Alarm(std::optional<std::chrono::milliseconds> after, std::function<void()> cancel) {
+    if (!after) {
+        return;
+    }
+    clock = std::jthread{[time = *after, cancel = std::move(cancel), waiting = pthread_self(),
+                          source = timeIsOver](const std::stop_token& stop) mutable {
+        pauseUnlessStopped(time, stop);
+        if (!stop.stop_requested()) {
+            source.request_stop();
+        }
+        while (!stop.stop_requested()) {
+            cancel();
+            wake(waiting);
+            pauseUnlessStopped(cancelInterval, stop);
+        }
+    }};
+}
 
 }  // namespace raidinfo
