@@ -53,8 +53,8 @@
  *     exported pointer `raidSystem` (C++, the configuration read last) tells more: it is null when
  *     the last answer was malformed, and what it was before when no answer came. A service that
  *     stays silent, be it that it accepts no connection, blocks the caller until cancelGetEvent is
- *     called on another thread. Functions are C++ inside: an exception such as std::bad_alloc may leave
- *     the count functions, RAIDinit, enableRAIDEvent and getEvent.
+ *     called on another thread. Functions are C++ inside: an exception such as std::bad_alloc may
+ *     leave the count functions, RAIDinit, enableRAIDEvent and getEvent.
  *
  *  8. Events. Call enableRAIDEvent (start at the newest event) or setRAIDEventSequenceNumber
  *     (resume), then again and again getEvent, getRAIDEventCount and the event accessors.

@@ -5,6 +5,7 @@
 #include <utility>
 
 #include "exit_status.h"
+#include "text/enumerated.h"
 
 namespace raidinfo {
 namespace {
@@ -205,25 +206,12 @@ constexpr auto subcommands = std::to_array<Subcommand>({
 
 static_assert(subcommands.size() == std::variant_size_v<CommandOptions>);
 
-template <typename Rows, typename NameOf>
-std::string commaSeparated(const Rows& rows, const NameOf& nameOf) {
-    std::string names;
-    for (const auto& row : rows) {
-        names += (names.empty() ? "" : ", ") + std::string{nameOf(row)};
-    }
-    return names;
-}
-
 }  // namespace
 
 std::span<const Subcommand> allSubcommands() noexcept { return subcommands; }
 
-std::string subcommandNames() {
-    return commaSeparated(subcommands, [](const Subcommand& row) { return row.name; });
-}
+std::string subcommandNames() { return enumerated(subcommands, &Subcommand::name); }
 
-std::string kindNames() {
-    return commaSeparated(inventoryKinds(), [](const Kind& kind) { return kind.key; });
-}
+std::string kindNames() { return enumerated(inventoryKinds(), &Kind::key); }
 
 }  // namespace raidinfo

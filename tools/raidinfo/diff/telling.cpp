@@ -1,7 +1,10 @@
 #include <algorithm>
 #include <array>
+#include <string>
+#include <vector>
 
 #include "diff/diff.h"
+#include "text/enumerated.h"
 
 namespace raidinfo::diff {
 namespace {
@@ -35,24 +38,20 @@ std::string_view wordOf(Direction direction) {
     return "neutral";
 }
 
-void append(std::string& list, const std::string& item) {
-    list += (list.empty() ? "" : ", ") + item;
+std::string placeStep(const Step& step) {
+    return std::string{step.label} + " " + step.number.dump();
 }
 
 std::string sentence(const Change& change) {
-    std::string place;
-    for (const Step& step : change.place) {
-        append(place, std::string{step.label} + " " + step.number.dump());
-    }
-    std::string events;
+    std::vector<std::string> events;
     if (change.type != Type::changed) {
         const std::string verb{wordsOf(change.type).verb};
-        append(events, std::string{change.noun} + " " + (verb.empty() ? change.origin : verb));
+        events.push_back(std::string{change.noun} + " " + (verb.empty() ? change.origin : verb));
     }
     for (const Detail& detail : change.details) {
-        append(events, detail.text);
+        events.push_back(detail.text);
     }
-    return place + ": " + events;
+    return enumerated(change.place, placeStep) + ": " + enumerated(events);
 }
 
 Json placeData(const Place& place) {

@@ -15,12 +15,14 @@
 #include <stop_token>
 #include <system_error>
 #include <utility>
+#include <vector>
 
 #include "doctor/library_log.h"
 #include "inventory/kinds.h"
 #include "source/service_address.h"
 #include "system/alarm.h"
 #include "system/descriptor.h"
+#include "text/enumerated.h"
 
 namespace raidinfo {
 namespace {
@@ -140,18 +142,18 @@ Examined wellFormed(const Library& library, const std::stop_token& over) {
 }
 
 Examined published(const Library& library) {
-    std::string counts;
+    std::vector<std::string> counts;
     int adapters = 0;
     for (const Kind& kind : inventoryKinds()) {
         const int count = library.function<int()>(kind.count)();
         adapters += kind.id <= KindId::vantryAdapter ? count : 0;
         if (count > 0) {
-            counts +=
-                (counts.empty() ? "" : ", ") + std::to_string(count) + " " + std::string{kind.key};
+            counts.push_back(std::to_string(count) + " " + std::string{kind.key});
         }
     }
-    return {"published", "Lists", adapters > 0 ? Outcome::fine : Outcome::noteworthy,
-            (adapters > 0 ? "" : "no adapter; ") + (counts.empty() ? "all empty" : counts)};
+    return {
+        "published", "Lists", adapters > 0 ? Outcome::fine : Outcome::noteworthy,
+        (adapters > 0 ? "" : "no adapter; ") + (counts.empty() ? "all empty" : enumerated(counts))};
 }
 
 }  // namespace

@@ -4,12 +4,12 @@
 
 #include "health/condition.h"
 #include "settings/table_reader.h"
+#include "text/enumerated.h"
 
 namespace raidinfo::health {
 namespace {
 
 using settings::Entry;
-using settings::joined;
 using settings::refuse;
 using settings::refuseUnknown;
 using settings::Setting;
@@ -125,7 +125,7 @@ private:
         // Without any codes all are unknown, and that is what the code book wants.
         if (!codes->empty() && std::ranges::find(names, name) == names.end()) {
             refuse(setting.place, "no code of " + qualified + " is called \"" + name +
-                                      "\"; known: " + joined(names) + " (" +
+                                      "\"; known: " + enumerated(names) + " (" +
                                       std::string{codesStandAt} + ")");
         }
     }
@@ -189,7 +189,8 @@ Condition readCondition(const Setting& setting, std::string_view kind,
         comparison = &entry;
     }
     if (comparison == nullptr) {
-        refuse(setting.place, "the condition lacks an operator: " + joined(keysOf(operatorWords)));
+        refuse(setting.place,
+               "the condition lacks an operator: " + enumerated(keysOf(operatorWords)));
     }
     const auto words = std::ranges::find(operatorWords, comparison->key, &OperatorWords::key);
     if (words == operatorWords.end()) {

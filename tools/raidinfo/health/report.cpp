@@ -9,6 +9,7 @@
 
 #include "health/vocabulary.h"
 #include "settings/setting.h"
+#include "text/enumerated.h"
 #include "text/printable.h"
 
 namespace raidinfo::health {
@@ -58,11 +59,8 @@ std::string recordName(const Culprit& record) {
 }
 
 std::string factsOf(const Finding& finding) {
-    std::string text;
-    for (const Fact& fact : finding.facts) {
-        text += (text.empty() ? "" : ", ") + fact.field + " = " + fact.shown;
-    }
-    return text;
+    return enumerated(finding.facts,
+                      [](const Fact& fact) { return fact.field + " = " + fact.shown; });
 }
 
 const Checked* ruleOf(const Verdict& verdict, const Finding& finding) {
@@ -89,7 +87,7 @@ Row rowOf(const Checked& rule) {
     }
     return {rule.rule, std::string{word(rule.severity)}, std::to_string(rule.records),
             std::to_string(rule.findings),
-            settings::joined(rule.kinds) + ": " + printable(rule.condition)};
+            enumerated(rule.kinds) + ": " + printable(rule.condition)};
 }
 
 std::string ruleTable(const Verdict& verdict) {

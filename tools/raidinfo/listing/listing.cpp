@@ -5,6 +5,8 @@
 #include <map>
 #include <utility>
 
+#include "text/enumerated.h"
+
 namespace raidinfo {
 namespace {
 
@@ -55,11 +57,8 @@ std::vector<ListColumn> columnsOf(const Kind& kind) {
 }
 
 std::string withoutColumn(const Kind& kind, std::string_view key) {
-    std::string list;
-    for (const ListColumn& column : columnsOf(kind)) {
-        list += (list.empty() ? "" : ", ") + std::string{column.key};
-    }
-    return std::string{kind.key} + " has no column \"" + std::string{key} + "\"; it has " + list;
+    return std::string{kind.key} + " has no column \"" + std::string{key} + "\"; it has " +
+           enumerated(columnsOf(kind), &ListColumn::key);
 }
 
 Listing listingOf(const Kind& kind, const Snapshot& snapshot, const Group& trees) {

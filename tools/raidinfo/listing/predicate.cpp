@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "exit_status.h"
+#include "text/enumerated.h"
 
 namespace raidinfo {
 namespace {
@@ -83,11 +84,7 @@ std::string namesOf(const CodeBook::Codes& codes) {
     for (const auto& [code, name] : codes) {
         names.insert(name);
     }
-    std::string list;
-    for (const std::string_view name : names) {
-        list += (list.empty() ? "" : ", ") + std::string{name};
-    }
-    return list;
+    return enumerated(names);
 }
 
 /// "state=online": several codes can have one name, and any code can be without one.

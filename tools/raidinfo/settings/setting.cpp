@@ -4,6 +4,7 @@
 
 #include "exit_status.h"
 #include "text/decoded.h"
+#include "text/enumerated.h"
 #include "text/printable.h"
 
 namespace raidinfo::settings {
@@ -31,7 +32,7 @@ void refuse(const Place& place, const std::string& problem) {
 
 void refuseUnknown(const Place& place, const std::string& what, const std::string& word,
                    const std::vector<std::string>& known) {
-    refuse(place, "unknown " + what + " \"" + word + "\"; known: " + joined(known));
+    refuse(place, "unknown " + what + " \"" + word + "\"; known: " + enumerated(known));
 }
 
 bool flagOf(const Setting& setting) { return typed<bool>(setting, "true or false"); }
@@ -51,13 +52,5 @@ const std::string& textOf(const Setting& setting) {
 const Table& tableOf(const Setting& setting) { return typed<Table>(setting, "a table"); }
 
 const List& listOf(const Setting& setting) { return typed<List>(setting, "a list"); }
-
-std::string joined(const std::vector<std::string>& words) {
-    std::string result;
-    for (const std::string& word : words) {
-        result += (result.empty() ? "" : ", ") + word;
-    }
-    return result;
-}
 
 }  // namespace raidinfo::settings

@@ -47,7 +47,4 @@ struct Entry {
 [[nodiscard]] const Table& tableOf(const Setting& setting);
 [[nodiscard]] const List& listOf(const Setting& setting);
 
-/// "a, b, c"
-[[nodiscard]] std::string joined(const std::vector<std::string>& words);
-
 }  // namespace raidinfo::settings

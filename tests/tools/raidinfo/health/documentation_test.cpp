@@ -7,7 +7,7 @@
 #include "health/policy.h"
 #include "health/vocabulary.h"
 #include "settings/document.h"
-#include "settings/setting.h"
+#include "text/enumerated.h"
 
 namespace raidinfo::health {
 namespace {
@@ -64,8 +64,8 @@ TEST(Documentation, ListsTheDefaultRules) {
         for (const Scope& scope : rule.scopes) {
             kinds.push_back(scope.kind);
         }
-        rows.push_back("| `" + rule.name + "` | " + settings::joined(kinds) + " | " +
-                       inWords(rule) + " | " + std::string{word(rule.severity)} + " |");
+        rows.push_back("| `" + rule.name + "` | " + enumerated(kinds) + " | " + inWords(rule) +
+                       " | " + std::string{word(rule.severity)} + " |");
     }
     EXPECT_THAT(rowsOf("The default rules"), ElementsAreArray(rows));
 }
@@ -73,7 +73,7 @@ TEST(Documentation, ListsTheDefaultRules) {
 TEST(Documentation, ListsTheDefaultCounts) {
     std::vector<std::string> rows;
     for (const Count& count : defaultPolicy(shippedCodeBook()).counts) {
-        rows.push_back("| `" + count.name + "` | " + settings::joined(count.on) + " | " + count.of +
+        rows.push_back("| `" + count.name + "` | " + enumerated(count.on) + " | " + count.of +
                        " of the " + (count.within == Count::Within::adapter ? "adapter" : "array") +
                        " | " + inWords(count.when) + " |");
     }
