@@ -21,7 +21,6 @@
 #include "json/schema.h"
 #include "library/library.h"
 #include "overloaded.h"
-#include "source/service_failures.h"
 #include "system/cancellable.h"
 #include "system/output.h"
 
@@ -60,12 +59,8 @@ int runInLibrary(const Options& options, const Output& output) {
                        [&session](const auto& command) { return runCommand(session, command); }},
             options.command);
     };
-    const Ending ending = cancellable.run(work, library.function<void()>("cancelGetEvent"),
-                                          options.limitOf(Limited::program));
-    if (ending.timedOut) {
-        throw noAnswerInTime();
-    }
-    return ending.signal ? signalExitBase + *ending.signal : status;
+    const auto signal = cancellable.run(work, library.function<void()>("cancelGetEvent"));
+    return signal ? signalExitBase + *signal : status;
 }
 
 /// A monitoring system takes any other status for that of a plugin that is broken.

@@ -1,5 +1,7 @@
+#include <fcntl.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 
 #include <csignal>
 #include <nlohmann/json.hpp>
@@ -10,6 +12,7 @@
 #include "scripted.h"
 #include "support/busy_service.h"
 #include "support/files.h"
+#include "support/socket.h"
 
 namespace raidinfo::test {
 namespace {
@@ -136,6 +139,15 @@ TEST(FailingProgram, IsInterruptedWhileItWaitsForTheInventory) {
     const Result result = program.finish();
     EXPECT_EQ(result.status, 130);
     EXPECT_EQ(result.output + result.errors, "");
+}
+
+TEST(FailingProgram, IsInterruptedWhileItWaitsForAFile) {
+    ASSERT_EQ(mkfifo("silent.rec", 0600), 0);
+    Program program{raidinfo({"tree", "--from", "silent.rec"})};
+    // Opens once the program has opened the other end.
+    const raid::test::Socket writer{open("silent.rec", O_WRONLY | O_CLOEXEC)};
+    program.signal(SIGINT);
+    EXPECT_EQ(program.finish().status, 130);
 }
 
 TEST(FailingProgram, SaysWhyTheLibraryCannotBeLoaded) {

@@ -84,7 +84,6 @@ Options Description::options() const {
                 throw Failure{ExitStatus::usage, subcommand.withoutRecording};
             }
             options.command = subcommand.read(*app, words);
-            options.limited = subcommand.limited;
         }
     }
     return options;

@@ -1,7 +1,6 @@
 #pragma once
 
 #include <chrono>
-#include <cstdint>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -74,10 +73,6 @@ using CommandOptions = std::variant<ListOptions, ShowOptions, TreeOptions, Event
                                     WatchOptions, HealthOptions, SnapshotOptions, DiffOptions,
                                     RecordOptions, DoctorOptions, CompletionOptions, SchemaOptions>;
 
-/// What ends when the time that --timeout gives is over: the wait for the first answer where the
-/// subcommand has something to say or to do besides, else the program.
-enum class Limited : std::uint8_t { answer, program };
-
 struct Options {
     CommandOptions command = {};
     bool json = false;
@@ -85,12 +80,7 @@ struct Options {
     std::optional<Path> library = std::nullopt;
     std::optional<Path> recording = std::nullopt;  ///< to read instead of the service
     std::optional<Path> codes = std::nullopt;
-    Limited limited = Limited::program;
-    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< none: without end
-
-    [[nodiscard]] std::optional<std::chrono::milliseconds> limitOf(Limited what) const {
-        return limited == what ? limit : std::nullopt;
-    }
+    std::optional<std::chrono::milliseconds> limit = std::nullopt;  ///< of the wait for an answer
 };
 
 /// A text that was asked for instead of a command: help or the version.

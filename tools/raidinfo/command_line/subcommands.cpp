@@ -115,8 +115,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          return EventsOptions{optionalNumber(app, "--since", words.since),
                               optionalNumber(app, "--count", words.count), words.command,
                               optionalPath(words.state)};
-     },
-     Limited::answer},
+     }},
     {"watch", "Show the tree again whenever something happens",
      "What changed is marked with \"*\". Ctrl-C ends it.\n"
      "Example: raidinfo watch --interval 10",
@@ -128,7 +127,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
      [](const CLI::App&, const Words& words) -> CommandOptions {
          return WatchOptions{std::chrono::seconds{words.interval}};
      },
-     Limited::answer, "a recording does not change; watch needs the service"},
+     "a recording does not change; watch needs the service"},
     {"health", "Say in one word how the machine's RAID is",
      "Exit status: 0 ok, 1 warning, 2 critical, 3 unknown.\n"
      "Examples:\n"
@@ -145,8 +144,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
              throw Failure{ExitStatus::usage, "--nagios goes neither with --explain nor --json"};
          }
          return HealthOptions{words.explain, words.nagios, optionalPath(words.policy)};
-     },
-     Limited::answer},
+     }},
     {"snapshot", "Save the inventory to compare it later", "Example: raidinfo snapshot before.json",
      [](CLI::App& app, Words& words) {
          addFileOperand(app, "file", words.file, "The file to write; - prints it")->required();
@@ -191,11 +189,11 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          }
          return record;
      },
-     Limited::answer, "record saves what the service answers, not a recording"},
+     "record saves what the service answers, not a recording"},
     {"doctor", "Say what is wrong when nothing shows", "Example: raidinfo doctor",
      [](CLI::App&, Words&) {},
      [](const CLI::App&, const Words&) -> CommandOptions { return DoctorOptions{}; },
-     Limited::answer, "doctor examines the service, not a recording"},
+     "doctor examines the service, not a recording"},
     {"completion", "Print the completion for bash",
      "Example: raidinfo completion > /etc/bash_completion.d/raidinfo", [](CLI::App&, Words&) {},
      [](const CLI::App&, const Words&) -> CommandOptions { return CompletionOptions{}; }},

@@ -14,7 +14,6 @@ struct Subcommand {
     const char* examples = nullptr;
     void (*declare)(CLI::App&, Words&) = nullptr;
     CommandOptions (*read)(const CLI::App&, const Words&) = nullptr;
-    Limited limited = Limited::program;
     const char* withoutRecording = nullptr;  ///< why --from is refused, where it is
 };
 

@@ -44,7 +44,7 @@ int runCommand(const Session& session, const DoctorOptions& /*doctor*/) {
     auto status = ExitStatus::ok;
     std::vector<Trouble> troubles;
     auto findings = Json::array();
-    const auto limit = session.options().limitOf(Limited::answer);
+    const auto limit = session.options().limit;
     examine(session.library(), limit, [&](const Examined& found) {
         if (found.outcome == Examined::Outcome::bad) {
             status = found.status;

@@ -122,7 +122,7 @@ void showRecorded(const Session& session, const StreamStart& start, const EventL
 }  // namespace
 
 int runCommand(const Session& session, const EventsOptions& events) {
-    const StreamStart start = startOf(events, session.options().limitOf(Limited::answer));
+    const StreamStart start = startOf(events, session.options().limit);
     Presentation presentation{session, events, start.shownBefore};
     const EventListener listener{
         [&presentation](const Record& event) { return presentation.show(event); },

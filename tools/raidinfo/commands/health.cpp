@@ -1,5 +1,3 @@
-#include <stop_token>
-
 #include "commands/commands.h"
 #include "exit_status.h"
 #include "health/health_json.h"
@@ -7,8 +5,6 @@
 #include "health/nagios.h"
 #include "health/policy.h"
 #include "health/report.h"
-#include "source/service_failures.h"
-#include "system/alarm.h"
 
 namespace raidinfo {
 namespace {
@@ -23,16 +19,12 @@ health::Verdict verdictOf(const Session& session, const HealthOptions& options,
     const CodeBook& book = session.codeBook();
     const health::Policy policy =
         options.policy ? health::readPolicy(*options.policy, book) : health::defaultPolicy(book);
-    const Alarm alarm{session.options().limitOf(Limited::answer),
-                      session.library().function<void()>("cancelGetEvent")};
-    const std::stop_token over = alarm.over();
     try {
-        return health::judge(session.inventory(over).adapters(), policy, book);
-    } catch (const Failure& thrown) {
-        if (!isUnknownState(thrown)) {
+        return health::judge(session.inventory().adapters(), policy, book);
+    } catch (const Failure& failure) {
+        if (!isUnknownState(failure)) {
             throw;
         }
-        const Failure failure = over.stop_requested() ? noAnswerInTime() : thrown;
         troubles.push_back({troubleCode(failure.status()), failure.what()});
         return health::unknownBecause(failure.what());
     }

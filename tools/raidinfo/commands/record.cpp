@@ -44,8 +44,8 @@ int runCommand(const Session& session, const RecordOptions& record) {
         }
         file->append(text);
     };
-    recordAnswers(session.library(), sink,
-                  {record.duration, session.options().limitOf(Limited::answer)}, session.stop());
+    recordAnswers(session.library(), sink, {record.duration, session.options().limit},
+                  session.stop());
     if (session.options().json && !toOutput) {
         session.print(Json::object({{"file", record.file.string()}, {"answers", answers}}));
     }

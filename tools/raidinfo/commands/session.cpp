@@ -10,6 +10,8 @@
 #include "source/recorded.h"
 #include "source/service.h"
 #include "source/service_address.h"
+#include "source/service_failures.h"
+#include "system/alarm.h"
 #include "text/printable.h"
 
 namespace raidinfo {
@@ -35,8 +37,19 @@ Session::Session(const Options& given, const Library& loaded, const Output& dest
 
 GridLayout Session::layout() const { return {.width = screen.width, .painter = painter()}; }
 
-Trees Session::inventory(const std::stop_token& stop) const {
-    return Trees{answers ? recordedInventory(lib, *answers) : readInventory(lib, stop)};
+Trees Session::inventory() const {
+    if (answers) {
+        return Trees{recordedInventory(lib, *answers)};
+    }
+    const Alarm alarm{chosen.limit, lib.function<void()>("cancelGetEvent")};
+    try {
+        return Trees{readInventory(lib, alarm.over())};
+    } catch (const Failure&) {
+        if (alarm.over().stop_requested()) {
+            throw noAnswerInTime();
+        }
+        throw;
+    }
 }
 
 const CodeBook& Session::codeBook() const {

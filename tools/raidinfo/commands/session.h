@@ -53,11 +53,8 @@ public:
         return answers;
     }
 
-    /// Of the service, or of the recording.
-    [[nodiscard]] Trees inventory() const { return inventory(stopToken); }
-
-    /// The same, which means nothing once stop is requested.
-    [[nodiscard]] Trees inventory(const std::stop_token& stop) const;
+    /// Of the service, which is waited for as long as the options say, or of the recording.
+    [[nodiscard]] Trees inventory() const;
 
     /// What the service's numbers mean.
     [[nodiscard]] const CodeBook& codeBook() const;

@@ -11,6 +11,7 @@
 #include "events/wait.h"
 #include "exit_status.h"
 #include "json/json.h"
+#include "source/service.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
 #include "system/backoff.h"
@@ -49,7 +50,7 @@ public:
 private:
     /// Reads and shows the inventory; what is shown stays where the service does not answer.
     bool look() {
-        const Alarm alarm{everShown ? std::nullopt : session.options().limitOf(Limited::answer),
+        const Alarm alarm{everShown ? std::nullopt : session.options().limit,
                           session.library().function<void()>("cancelGetEvent")};
         const std::stop_token over = alarm.over();
         if (askNewest() == 0) {
@@ -57,7 +58,7 @@ private:
         }
         const int seen = *newest;
         try {
-            const Trees trees = session.inventory(over);
+            const Trees trees = Trees{readInventory(session.library(), over)};
             if (session.stop().stop_requested()) {
                 return true;
             }

@@ -21,6 +21,9 @@ namespace {
 /// Interrupts the worker's system calls; its handler does nothing.
 constexpr int wakeSignal = SIGUSR1;
 
+/// Of the run that the thread works for; of none it is never requested.
+thread_local std::stop_token stopOfWork;
+
 bool isIgnored(int signal) {
     struct sigaction present = {};
     return sigaction(signal, nullptr, &present) == 0 && present.sa_handler == SIG_IGN;
@@ -65,10 +68,6 @@ void stopProgram() {
 using Clock = std::chrono::steady_clock;
 using Deadline = std::optional<Clock::time_point>;
 
-Deadline after(std::optional<std::chrono::milliseconds> limit) {
-    return limit ? Deadline{Clock::now() + *limit} : std::nullopt;
-}
-
 int millisecondsUntil(const Deadline& deadline) {
     if (!deadline) {
         return -1;
@@ -105,17 +104,19 @@ Happening waitFor(const Descriptor& signals, const Descriptor& finished, const D
 
 }  // namespace
 
+bool isCancelled() noexcept { return stopOfWork.stop_requested(); }
+
 void wake(pthread_t thread) { pthread_kill(thread, wakeSignal); }
 
 CancellableRun::CancellableRun()
     : signals{openSignals(), "cannot watch for signals"},
       finished{eventfd(0, EFD_CLOEXEC), "cannot make an event descriptor"} {}
 
-Ending CancellableRun::run(const std::function<void(std::stop_token)>& work,
-                           const std::function<void()>& cancel,
-                           std::optional<std::chrono::milliseconds> limit) {
+std::optional<int> CancellableRun::run(const std::function<void(std::stop_token)>& work,
+                                       const std::function<void()>& cancel) {
     std::exception_ptr thrown;
     std::jthread worker{[this, &work, &thrown](const std::stop_token& stop) {
+        stopOfWork = stop;
         try {
             work(stop);
         } catch (...) {
@@ -123,13 +124,12 @@ Ending CancellableRun::run(const std::function<void(std::stop_token)>& work,
         }
         eventfd_write(finished.get(), 1);
     }};
-    const Happening first = waitFor(signals, finished, after(limit));
-    const Ending ending{.timedOut = !first.finished && !first.signal, .signal = first.signal};
+    const Happening first = waitFor(signals, finished, std::nullopt);
     worker.request_stop();
     for (Happening now = first; !now.finished;) {
         cancel();
         wake(worker.native_handle());
-        now = waitFor(signals, finished, after(cancelInterval));
+        now = waitFor(signals, finished, Clock::now() + cancelInterval);
         if (now.signal) {
             abandonTerminal();
             std::_Exit(signalExitBase + *now.signal);
@@ -138,10 +138,10 @@ Ending CancellableRun::run(const std::function<void(std::stop_token)>& work,
     worker.join();
     eventfd_t count = 0;
     eventfd_read(finished.get(), &count);
-    if (thrown && !ending.signal && !ending.timedOut) {
+    if (thrown && !first.signal) {
         std::rethrow_exception(thrown);
     }
-    return ending;
+    return first.signal;
 }
 
 }  // namespace raidinfo

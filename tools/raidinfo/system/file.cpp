@@ -13,6 +13,7 @@
 #include <utility>
 
 #include "exit_status.h"
+#include "system/blocking_io.h"
 
 namespace raidinfo {
 namespace {
@@ -56,17 +57,6 @@ int created(const std::filesystem::path& path) {
         throw failure(ExitStatus::cannotCreate, "cannot write", path);
     }
     return number;
-}
-
-bool writeAll(const Descriptor& file, std::string_view content) {
-    while (!content.empty()) {
-        const ssize_t written = write(file.get(), content.data(), content.size());
-        if (written < 0 && errno != EINTR) {
-            return false;
-        }
-        content.remove_prefix(written > 0 ? static_cast<std::size_t>(written) : 0);
-    }
-    return true;
 }
 
 /// A file beside the one that it is going to replace, of a name that no other has; gone in the end
@@ -128,18 +118,17 @@ std::string readFile(const std::filesystem::path& path) {
     std::string content;
     std::array<char, 65536> piece{};
     while (true) {
-        const ssize_t size = read(file.get(), piece.data(), piece.size());
+        const ssize_t size = readSome(file.get(), piece);
+        if (size < 0) {
+            throw failure(ExitStatus::noInput, "cannot read", path);
+        }
         if (size == 0) {
             return content;
         }
-        if (size > 0) {
-            content.append(piece.data(), static_cast<std::size_t>(size));
-            if (content.size() > longestFile) {
-                throw Failure{ExitStatus::badInput, path.string() + " is longer than " +
-                                                        std::to_string(longestFile) + " bytes"};
-            }
-        } else if (errno != EINTR) {
-            throw failure(ExitStatus::noInput, "cannot read", path);
+        content.append(piece.data(), static_cast<std::size_t>(size));
+        if (content.size() > longestFile) {
+            throw Failure{ExitStatus::badInput, path.string() + " is longer than " +
+                                                    std::to_string(longestFile) + " bytes"};
         }
     }
 }
@@ -152,7 +141,7 @@ void replaceFile(const std::filesystem::path& path, std::string_view content) {
     }
     const std::filesystem::path place = withoutLinks(path);
     const NewFile beside{place, before};
-    if (!writeAll(beside.descriptor(), content) || !beside.moveTo(place)) {
+    if (!writeAll(beside.descriptor().get(), content) || !beside.moveTo(place)) {
         throw failure(ExitStatus::cannotCreate, "cannot write", path);
     }
 }
@@ -161,7 +150,7 @@ GrowingFile::GrowingFile(std::filesystem::path path)
     : name{std::move(path)}, file{created(name), "cannot write a file"} {}
 
 void GrowingFile::append(std::string_view piece) const {
-    if (!writeAll(file, piece)) {
+    if (!writeAll(file.get(), piece)) {
         throw failure(ExitStatus::cannotCreate, "cannot write", name);
     }
 }

@@ -4,10 +4,10 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <cstddef>
 #include <system_error>
 
 #include "exit_status.h"
+#include "system/blocking_io.h"
 
 namespace raidinfo {
 namespace {
@@ -39,13 +39,8 @@ Output::Output() : original{copyOfStandardOutput(), "standard output"} {
 }
 
 void Output::write(std::string_view text) const {
-    while (!text.empty()) {
-        const ssize_t written = ::write(original.get(), text.data(), text.size());
-        if (written >= 0) {
-            text.remove_prefix(static_cast<std::size_t>(written));
-        } else if (errno != EINTR) {
-            throw failure();
-        }
+    if (!writeAll(original.get(), text)) {
+        throw failure();
     }
 }
 

@@ -51,16 +51,10 @@ TEST(Options, AskForJsonAndALibraryOnEitherSideOfTheCommand) {
     EXPECT_EQ(options({"events", "--library", "b.so"}).library, "b.so");
 }
 
-TEST(Options, LimitTheProgramOrTheFirstAnswer) {
+TEST(Options, LimitTheWaitForAnAnswer) {
     EXPECT_EQ(options({"list"}).limit, std::chrono::seconds{60});
     EXPECT_EQ(options({"tree", "--timeout", "5"}).limit, std::chrono::seconds{5});
     EXPECT_EQ(options({"tree", "--timeout", "0"}).limit, std::nullopt);
-    EXPECT_EQ(options({"tree"}).limited, Limited::program);
-    for (const char* const name : {"events", "watch", "health", "doctor"}) {
-        EXPECT_EQ(options({name}).limited, Limited::answer) << name;
-        EXPECT_EQ(options({name}).limit, std::chrono::seconds{60}) << name;
-    }
-    EXPECT_EQ(options({"list"}).limitOf(Limited::answer), std::nullopt);
 }
 
 TEST(Options, ChooseTheColour) {
