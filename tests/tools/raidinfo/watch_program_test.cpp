@@ -2,6 +2,7 @@
 #include <gtest/gtest.h>
 
 #include <csignal>
+#include <filesystem>
 #include <nlohmann/json.hpp>
 #include <sstream>
 #include <utility>
@@ -11,11 +12,14 @@
 #include "program.h"
 #include "scripted.h"
 #include "simulator.h"
+#include "support/files.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
+using raid::test::readFile;
+using raid::test::writeFile;
 using testing::AllOf;
 using testing::ContainsRegex;
 using testing::EndsWith;
@@ -52,8 +56,32 @@ TEST(WatchCommand, NoticesWhatHappensWithoutAnEvent) {
     EXPECT_EQ(watch.finish().status, 130);
 }
 
+TEST(WatchCommand, TellsOfAnEventThatChangesNothing) {
+    Simulator simulator{"small-server.xml"};
+    Program watch{raidinfo({"watch", "--interval", "3600"})};
+    watch.waitForOutput("Logical drive 1");
+    simulator.command("event type=Warning string=\"Patrol read started\"");
+    EXPECT_THAT(watch.waitForOutput("Patrol read started"), Not(HasSubstr("* ")));
+    watch.signal(SIGINT);
+    EXPECT_EQ(watch.finish().status, 130);
+}
+
+TEST(WatchCommand, TellsOfAnAdapterThatComesAndGoes) {
+    const auto empty = std::filesystem::current_path() / "no-adapters.xml";
+    writeFile(empty, configuration(""));
+    Simulator simulator{empty};
+    Program watch{raidinfo({"watch", "--interval", "3600"})};
+    EXPECT_THAT(watch.waitForOutput("No adapters"), Not(HasSubstr("* ")));
+    simulator.command("reload " RAID_EXAMPLES "/small-server.xml\nevent type=Information");
+    watch.waitForOutput("* Pellion adapter 1: Normal");
+    simulator.command("reload " + empty.string() + "\nevent type=Information");
+    watch.waitForOutput("- Pellion adapter 1: gone");
+    watch.signal(SIGINT);
+    EXPECT_EQ(watch.finish().status, 130);
+}
+
 // The wait for an event after 4 ends at once, for there is 50.
-TEST(WatchCommand, IsNotKeptBusyByNumbersInDisorder) {
+TEST(WatchCommand, GoesOnAfterItsPauseWhereTheNumbersAreInDisorder) {
     const Connection configured = answering(configuration(sampleAdapter()));
     const Connection four = answering(newestEventDocument("4"));
     const Connection awaited = answering("the answer to the wait is not looked at");
@@ -84,6 +112,16 @@ TEST(WatchCommand, WritesADocumentForEachChange) {
     EXPECT_GE(documents, 2);
 }
 
+TEST(WatchCommand, WritesADocumentAlsoForWhatTheDrawingLeavesOut) {
+    Simulator simulator{"small-server.xml"};
+    Program watch{raidinfo({"watch", "--interval", "3600", "--json"})};
+    EXPECT_THAT(watch.waitForOutput("\n"), Not(HasSubstr("\"blocked\":true")));
+    simulator.command("set adapter:1/logical:1 blocked=true\nevent type=Information");
+    watch.waitForOutput("\"blocked\":true");
+    watch.signal(SIGINT);
+    EXPECT_EQ(watch.finish().status, 130);
+}
+
 constexpr auto enter = "\x1b[?1049h\x1b[?25l";
 constexpr auto leave = "\x1b[?25h\x1b[?1049l";
 
@@ -104,6 +142,32 @@ TEST(WatchCommand, LeavesTheTerminalAsItWasWhateverKeyEndsIt) {
         EXPECT_THAT(result.output, StartsWith(enter));
         EXPECT_THAT(result.output, EndsWith(leave));
     }
+}
+
+TEST(WatchCommand, KeepsWhatChangedAndTheEventsInSightOnASmallTerminal) {
+    Simulator simulator{"small-server.xml"};
+    Program watch{
+        onATerminal("stty rows 8 columns 60; exec " RAIDINFO_PROGRAM " watch --interval 3600")};
+    EXPECT_THAT(watch.waitForOutput("more lines"), Not(HasSubstr("state 1 (online)")));
+    simulator.command(failure);
+    simulator.command(event);
+    EXPECT_THAT(watch.waitForOutput("Drive failed"), HasSubstr("state 1 (online)"));
+    watch.send("\x03");
+    EXPECT_EQ(watch.finish().status, 130);
+}
+
+TEST(WatchCommand, FollowsTheSizeOfTheTerminal) {
+    const Simulator simulator{"small-server.xml"};
+    Program watch{onATerminal("stty rows 8 columns 60; tty > tty.txt; exec " RAIDINFO_PROGRAM
+                              " watch --interval 3600")};
+    watch.waitForOutput("more lines");
+    const std::string terminal = readFile("tty.txt");
+    Program resize{{"/usr/bin/env", "stty", "-F", terminal.substr(0, terminal.find('\n')), "rows",
+                    "60", "columns", "200"}};
+    EXPECT_EQ(resize.finish().status, 0);
+    watch.waitForOutput("Logical drive 1");
+    watch.send("\x03");
+    EXPECT_EQ(watch.finish().status, 130);
 }
 
 // A shell with job control, for without one nobody could continue it.

@@ -1,21 +1,23 @@
-#include <algorithm>
+#include <chrono>
 #include <cstdint>
 #include <nlohmann/json.hpp>
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "commands/commands.h"
-#include "events/event_line.h"
-#include "events/follower.h"
 #include "events/wait.h"
 #include "exit_status.h"
 #include "json/json.h"
+#include "presentation/tree.h"
 #include "source/service.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
 #include "system/backoff.h"
 #include "system/timestamp.h"
+#include "watch/idle_waits.h"
+#include "watch/latest_events.h"
 #include "watch/screen.h"
 #include "watch/tree_lines.h"
 
@@ -89,31 +91,56 @@ private:
     }
 
     void show(const Trees& trees) {
-        std::vector<TreeLine> now = treeLines(trees.adapters(), session.codeBook());
-        const bool changed = markChanges(now, lines);
         const bool first = !everShown;
         const bool recovered = !trouble.empty();
         trouble.clear();
-        lines = std::move(now);
         everShown = true;
         if (session.options().json) {
-            if (first || changed || recovered) {
-                session.printLine({}, treeJson(trees.adapters()));
+            Json data = treeJson(trees.adapters());
+            if (first || recovered || data != printed) {
+                session.printLine({}, data);
+                printed = std::move(data);
             }
-        } else if (session.terminal().cursorMoves || first || changed || recovered) {
+            return;
+        }
+        const bool changed = takeLines(trees, first);
+        const bool isNews = first || changed || recovered || hasNewEvents;
+        hasNewEvents = false;
+        if (session.terminal().cursorMoves || isNews) {
             draw();
         }
     }
 
-    void draw() {
-        std::vector<ScreenLine> text{{"RAID at " + presentTimestamp(), Style::heading}};
-        if (!trouble.empty()) {
-            text.push_back({trouble, Style::critical});
+    /// Returns whether there are marks that are new.
+    bool takeLines(const Trees& trees, bool first) {
+        std::vector<TreeLine> now = treeLines(trees.adapters(), session.codeBook());
+        const bool changed = !first && markChanges(now, lines);
+        const auto present = Clock::now();
+        // Elsewhere the picture with the marks stays where it is.
+        if (session.terminal().cursorMoves && present < marked + timeOfMarks) {
+            keepMarks(now, lines);
         }
-        const std::vector<ScreenLine> tree = drawnLines(lines);
-        text.insert(text.end(), tree.begin(), tree.end());
-        text.insert(text.end(), lastEvents.begin(), lastEvents.end());
-        screen->show(text);
+        if (changed) {
+            marked = present;
+        }
+        lines = std::move(now);
+        return changed;
+    }
+
+    void draw() {
+        Picture picture{.above = {{"RAID at " + presentTimestamp(), Style::heading}},
+                        .tree = lines,
+                        .below = {}};
+        if (!trouble.empty()) {
+            picture.above.push_back({trouble, Style::critical});
+        }
+        if (lines.empty()) {
+            picture.above.push_back({std::string{noAdapters}});
+        }
+        for (const std::string& line : events.lines()) {
+            picture.below.push_back({line});
+        }
+        screen->show(std::move(picture));
     }
 
     /// Until something happens or the interval is over.
@@ -123,44 +150,20 @@ private:
         {
             const Alarm alarm{options.interval,
                               session.library().function<void()>("cancelGetEvent")};
-            isNew = tellEvents(wait.from(nextNumber()).events);
+            isNew = events.take(wait.from(events.awaited(newestSeen)).events, newestSeen);
             inTime = !alarm.over().stop_requested();
         }
-        // A service whose newest event has a lower number than others, or that fails, ends each
-        // wait at once.
-        idleWaits = inTime && !isNew ? idleWaits + 1 : 0;
-        if (idleWaits > 1) {
+        hasNewEvents = hasNewEvents || isNew;
+        idleWaits.ended(inTime, isNew);
+        if (idleWaits.needPause()) {
             pauseUnlessStopped(options.interval, session.stop());
         }
     }
 
-    /// What came while the inventory was read is told, too.
-    [[nodiscard]] std::int64_t nextNumber() const {
-        const std::int64_t next = newestSeen + 1;
-        const bool isCounting = continuity && newestSeen >= continuity->last().value_or(0);
-        return isCounting ? std::min(next, std::max<std::int64_t>(continuity->next(), 1)) : next;
-    }
+    using Clock = std::chrono::steady_clock;
 
-    /// Keeps the last ones for the picture; returns whether there were any.
-    bool tellEvents(const Records& batch) {
-        if (!continuity) {
-            continuity.emplace(newestSeen + 1);
-        }
-        const bool wentBack = continuity->last() && newestSeen < *continuity->last();
-        static_cast<void>(beginsAnew(*continuity, batch, wentBack, silent));
-        const auto fresh = continuity->accept(batch).fresh;
-        for (const std::size_t place : fresh) {
-            std::string line = eventLine(batch[place]);
-            line.pop_back();
-            lastEvents.push_back({std::move(line)});
-        }
-        constexpr std::size_t shownEvents = 3;
-        if (lastEvents.size() > shownEvents) {
-            lastEvents.erase(lastEvents.begin(),
-                             lastEvents.end() - static_cast<std::ptrdiff_t>(shownEvents));
-        }
-        return !fresh.empty();
-    }
+    /// So long a change stays marked on a terminal, though the next look may follow at once.
+    static constexpr std::chrono::seconds timeOfMarks{5};
 
     const Session& session;
     const WatchOptions& options;
@@ -170,14 +173,14 @@ private:
     EventWait wait;
     Backoff backoff;
     std::vector<TreeLine> lines;
-    std::vector<ScreenLine> lastEvents;
+    Clock::time_point marked{};  ///< when something was last
+    LatestEvents events;
     std::string trouble;
-    std::optional<Continuity> continuity;  ///< of the events, from the first wait on
-    EventListener silent{[](const Record& /*event*/) { return true; },
-                         [](const Notice& /*notice*/) {}};
+    Json printed;
     std::int64_t newestSeen = 0;  ///< before the last look
-    int idleWaits = 0;            ///< that ended early and brought nothing, in a row
+    IdleWaits idleWaits;
     bool everShown = false;
+    bool hasNewEvents = false;  ///< since the last picture
 };
 
 }  // namespace

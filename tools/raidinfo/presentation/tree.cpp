@@ -98,7 +98,7 @@ std::string drawn(const Group& roots, const CodeBook& book, const Painter& paint
     for (const DrawnLine& line : linesOf(roots, book, painter)) {
         drawing.append(line.margin).append(line.text).append("\n");
     }
-    return drawing.empty() ? "No adapters\n" : drawing;
+    return drawing.empty() ? std::string{noAdapters} + "\n" : drawing;
 }
 
 }  // namespace raidinfo

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "codebook/code_book.h"
@@ -8,6 +9,9 @@
 #include "presentation/painter.h"
 
 namespace raidinfo {
+
+/// What is said in place of a drawing without a line.
+inline constexpr std::string_view noAdapters = "No adapters";
 
 /// One line of the drawing: what joins it to the lines above, and what it says.
 struct DrawnLine {

@@ -37,6 +37,7 @@ int openSignals() {
     sigemptyset(&set);
     sigaddset(&set, SIGINT);
     sigaddset(&set, SIGTERM);
+    sigaddset(&set, SIGWINCH);
     // Whoever started the program may not want it to be ended or stopped by these: nohup, say.
     for (const int signal : {SIGHUP, SIGQUIT, SIGTSTP}) {
         if (!isIgnored(signal)) {
@@ -94,10 +95,13 @@ Happening waitFor(const Descriptor& signals, const Descriptor& finished, const D
         }
         if (ready > 0) {
             const int signal = takeSignal(signals);
-            if (signal != SIGTSTP) {
+            if (signal == SIGTSTP) {
+                stopProgram();
+            } else if (signal == SIGWINCH) {
+                redrawTerminal();
+            } else {
                 return {signal, watched[1].revents != 0};
             }
-            stopProgram();
         }
     }
 }

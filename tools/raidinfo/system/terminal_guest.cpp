@@ -37,6 +37,7 @@ TerminalGuest::~TerminalGuest() { announce(nullptr); }
 
 void leaveTerminal() { perform(&TerminalActs::leave); }
 void enterTerminal() { perform(&TerminalActs::enter); }
+void redrawTerminal() { perform(&TerminalActs::redraw); }
 void abandonTerminal() { perform(&TerminalActs::abandon); }
 
 }  // namespace raidinfo

@@ -8,6 +8,7 @@ namespace raidinfo {
 struct TerminalActs {
     std::function<void()> leave;    ///< before the program is stopped
     std::function<void()> enter;    ///< once it goes on
+    std::function<void()> redraw;   ///< when its size has changed; must wait for nobody
     std::function<void()> abandon;  ///< before it ends at once; must wait for nobody
 };
 
@@ -26,6 +27,7 @@ private:
 // Do the act of the guest there is, if any.
 void leaveTerminal();
 void enterTerminal();
+void redrawTerminal();
 void abandonTerminal();
 
 }  // namespace raidinfo

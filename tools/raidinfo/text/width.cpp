@@ -38,6 +38,21 @@ std::size_t widthOf(char32_t codePoint) {
     return contains(doubleWidth, codePoint) ? 2 : 1;
 }
 
+/// The bytes of the code points at the beginning that fit into so many columns.
+std::size_t bytesIn(std::string_view printable, std::size_t columns) {
+    std::size_t width = 0;
+    std::size_t bytes = 0;
+    while (bytes < printable.size()) {
+        const auto [codePoint, length] = firstCodePoint(printable.substr(bytes));
+        width += widthOf(codePoint.value_or(replacementCharacter));
+        if (width > columns) {
+            break;
+        }
+        bytes += length;
+    }
+    return bytes;
+}
+
 }  // namespace
 
 std::size_t displayWidth(std::string_view utf8) noexcept {
@@ -57,17 +72,32 @@ std::string shortened(std::string_view printable, std::size_t columns) {
     if (displayWidth(printable) <= columns) {
         return std::string{printable};
     }
-    std::size_t width = 1;  // of the sign that something is cut
-    std::size_t kept = 0;
-    while (kept < printable.size()) {
-        const auto [codePoint, length] = firstCodePoint(printable.substr(kept));
-        width += widthOf(codePoint.value_or(replacementCharacter));
-        if (width > columns) {
-            break;
+    return columns == 0 ? ""
+                        : std::string{printable.substr(0, bytesIn(printable, columns - 1))} + "…";
+}
+
+std::vector<std::string> folded(std::string_view beginning, std::string_view printable,
+                                std::size_t columns) {
+    std::vector<std::string> lines;
+    std::string start{beginning};
+    std::size_t taken = displayWidth(beginning);
+    const std::string indentation(std::min(taken, columns / 2), ' ');
+    do {
+        const std::size_t room = columns > taken ? columns - taken : 0;
+        std::size_t end = bytesIn(printable, room);
+        if (end == 0 && !printable.empty()) {
+            end = firstCodePoint(printable).length;  // Without any room, too, it comes to an end.
         }
-        kept += length;
-    }
-    return std::string{printable.substr(0, kept)} + (columns == 0 ? "" : "…");
+        if (const std::size_t space = printable.rfind(' ', end);
+            end < printable.size() && space != std::string_view::npos && space > 0) {
+            end = space;
+        }
+        lines.push_back(start + std::string{printable.substr(0, end)});
+        printable.remove_prefix(std::min(printable.find_first_not_of(' ', end), printable.size()));
+        start = indentation;
+        taken = indentation.size();
+    } while (!printable.empty());
+    return lines;
 }
 
 }  // namespace raidinfo

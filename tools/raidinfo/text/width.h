@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace raidinfo {
 
@@ -11,5 +12,10 @@ namespace raidinfo {
 
 /// The text, cut with "…" where it takes more columns than there are.
 [[nodiscard]] std::string shortened(std::string_view printable, std::size_t columns);
+
+/// The text on as many lines as it takes, cut at its spaces where that can be. The first line
+/// begins with this beginning, the others are indented by its width, at most by half the columns.
+[[nodiscard]] std::vector<std::string> folded(std::string_view beginning,
+                                              std::string_view printable, std::size_t columns);
 
 }  // namespace raidinfo

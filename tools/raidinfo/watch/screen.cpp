@@ -3,11 +3,9 @@
 #include <poll.h>
 #include <unistd.h>
 
-#include <algorithm>
 #include <exception>
-#include <string_view>
-
-#include "text/width.h"
+#include <string>
+#include <utility>
 
 namespace raidinfo {
 namespace {
@@ -27,6 +25,7 @@ Screen::Screen(const Output& destination, ColorChoice choice)
     if (inPlace) {
         guest.emplace(TerminalActs{.leave = [this] { leave(); },
                                    .enter = [this] { enter(); },
+                                   .redraw = [this] { redraw(); },
                                    .abandon = [this] { abandon(); }});
         output.write(enterSequence);
     }
@@ -57,11 +56,30 @@ void Screen::leave() noexcept {
 }
 
 void Screen::enter() noexcept {
-    const std::scoped_lock lock{drawing};
-    if (inPlace) {
-        isAway = false;
-        write(enterSequence);
-        write(picture);
+    {
+        const std::scoped_lock lock{drawing};
+        if (inPlace) {
+            isAway = false;
+            write(enterSequence);
+        }
+    }
+    redraw();
+}
+
+/// On the thread that watches for signals, which must not wait for a terminal that takes nothing.
+void Screen::redraw() noexcept {
+    const std::unique_lock lock{drawing, std::try_to_lock};
+    if (!lock) {
+        isStale = true;
+        return;
+    }
+    pollfd terminal{output.descriptor(), POLLOUT, 0};
+    if (inPlace && !isAway && shown && poll(&terminal, 1, 0) > 0) {
+        try {
+            output.write(drawnInPlace());
+        } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
+            // The next picture fails where it can be told.
+        }
     }
 }
 
@@ -74,43 +92,45 @@ void Screen::abandon() const noexcept {
     }
 }
 
-void Screen::show(const std::vector<ScreenLine>& lines) {
-    const Terminal terminal = terminalOf(output.descriptor(), colors);
-    if (inPlace) {
-        showInPlace(lines, terminal);
-    } else {
-        showBelow(lines, terminal);
-    }
-}
-
-void Screen::showInPlace(const std::vector<ScreenLine>& lines, const Terminal& terminal) {
-    const Painter painter{terminal.colors};
-    const std::size_t room = std::max<std::size_t>(terminal.height.value_or(0), 2);
-    const std::size_t shown = lines.size() > room ? room - 1 : lines.size();
-    std::string text = home;
-    for (std::size_t index = 0; index < shown; ++index) {
-        const auto& [line, style] = lines[index];
-        text += (index == 0 ? "" : "\r\n") +
-                painter(shortened(line, terminal.width.value_or(line.size())), style) + restOfLine;
-    }
-    if (shown < lines.size()) {
-        text += "\r\n" + std::to_string(lines.size() - shown) + " more lines" + restOfLine;
-    }
+void Screen::show(Picture picture) {
     const std::scoped_lock lock{drawing};
-    picture = text + restOfScreen;
-    if (!isAway) {
-        output.write(picture);
+    const bool isFirst = !shown;
+    shown = std::move(picture);
+    if (!inPlace) {
+        output.write((isFirst ? "" : "\n") + drawnBelow());
+    } else if (!isAway) {
+        do {
+            isStale = false;
+            output.write(drawnInPlace());
+        } while (isStale);
     }
 }
 
-void Screen::showBelow(const std::vector<ScreenLine>& lines, const Terminal& terminal) {
+std::string Screen::drawnInPlace() const {
+    const Terminal terminal = terminalOf(output.descriptor(), colors);
     const Painter painter{terminal.colors};
-    std::string text = drawnBefore ? "\n" : "";
+    const std::size_t rows = terminal.height.value_or(1);
+    const auto lines = fittedPicture(*shown, terminal.width.value_or(1), rows);
+    std::string text = home;
+    std::string_view separator;
     for (const auto& [line, style] : lines) {
+        // Erased first: behind the last column some terminals would erase what stands in it.
+        text.append(separator).append(restOfLine).append(painter(line, style));
+        separator = "\r\n";
+    }
+    if (lines.size() < rows) {
+        text.append(separator).append(restOfScreen);
+    }
+    return text;
+}
+
+std::string Screen::drawnBelow() const {
+    const Painter painter{terminalOf(output.descriptor(), colors).colors};
+    std::string text;
+    for (const auto& [line, style] : wholePicture(*shown)) {
         text += painter(line, style) + "\n";
     }
-    drawnBefore = true;
-    output.write(text);
+    return text;
 }
 
 }  // namespace raidinfo

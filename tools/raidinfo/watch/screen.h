@@ -1,25 +1,21 @@
 #pragma once
 
+#include <atomic>
 #include <mutex>
 #include <optional>
 #include <string>
-#include <vector>
+#include <string_view>
 
-#include "presentation/painter.h"
 #include "presentation/terminal.h"
 #include "system/output.h"
 #include "system/terminal_guest.h"
+#include "watch/picture.h"
 
 namespace raidinfo {
 
-struct ScreenLine {
-    std::string text;
-    Style style = Style::plain;
-};
-
-/// A picture that is drawn again in its place. On a terminal it has a screen of its own, and leaves
-/// the one before as it was, also while the program is stopped; elsewhere one picture follows
-/// another, with a blank line between.
+/// A picture that is drawn again in its place. On a terminal it has a screen of its own, follows
+/// its size, and leaves the one before as it was, also while the program is stopped; elsewhere one
+/// picture follows another, with a blank line between.
 class Screen {
 public:
     Screen(const Output& destination, ColorChoice choice);
@@ -27,14 +23,14 @@ public:
     Screen& operator=(const Screen&) = delete;
     ~Screen();
 
-    /// Cuts what does not fit a terminal as it is now, and says how many lines that were.
-    void show(const std::vector<ScreenLine>& lines);
+    void show(Picture picture);
 
 private:
-    void showInPlace(const std::vector<ScreenLine>& lines, const Terminal& terminal);
-    void showBelow(const std::vector<ScreenLine>& lines, const Terminal& terminal);
+    [[nodiscard]] std::string drawnInPlace() const;
+    [[nodiscard]] std::string drawnBelow() const;
 
     void write(std::string_view text) const noexcept;
+    void redraw() noexcept;
     void leave() noexcept;
     void enter() noexcept;
     void abandon() const noexcept;
@@ -42,9 +38,9 @@ private:
     const Output& output;
     ColorChoice colors;
     bool inPlace;
-    bool drawnBefore = false;
-    std::mutex drawing;  ///< the program may be stopped while it draws
-    std::string picture;
+    std::mutex drawing;  ///< the program may be stopped, or the terminal change, while it draws
+    std::optional<Picture> shown;
+    std::atomic<bool> isStale = false;   ///< the terminal changed while it was drawn
     bool isAway = false;                 ///< stopped, or about to be
     std::optional<TerminalGuest> guest;  ///< while there is a screen of its own
 };

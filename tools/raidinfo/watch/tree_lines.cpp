@@ -12,18 +12,6 @@ namespace {
 
 using Change = TreeLine::Change;
 
-std::string_view markOf(Change change) {
-    switch (change) {
-        case Change::changed:
-            return "* ";
-        case Change::gone:
-            return "- ";
-        case Change::none:
-            break;
-    }
-    return "  ";
-}
-
 /// Below each path several nodes may have the same title; they are counted.
 class Paths {
 public:
@@ -47,6 +35,19 @@ void addPaths(const Group& group, const std::string& above, Paths& paths,
     }
 }
 
+/// Those that are there.
+using LinesByPath = std::unordered_map<std::string_view, const TreeLine*>;
+
+LinesByPath byPath(const std::vector<TreeLine>& lines) {
+    LinesByPath found;
+    for (const TreeLine& line : lines) {
+        if (line.change != Change::gone) {
+            found.emplace(line.path, &line);
+        }
+    }
+    return found;
+}
+
 }  // namespace
 
 std::vector<TreeLine> treeLines(const Group& roots, const CodeBook& book) {
@@ -61,15 +62,7 @@ std::vector<TreeLine> treeLines(const Group& roots, const CodeBook& book) {
 }
 
 bool markChanges(std::vector<TreeLine>& now, const std::vector<TreeLine>& before) {
-    if (before.empty()) {
-        return false;
-    }
-    std::unordered_map<std::string_view, const TreeLine*> earlier;
-    for (const TreeLine& line : before) {
-        if (line.change != Change::gone) {
-            earlier.emplace(line.path, &line);
-        }
-    }
+    LinesByPath earlier = byPath(before);
     bool any = false;
     for (TreeLine& line : now) {
         const auto found = earlier.find(line.path);
@@ -90,14 +83,23 @@ bool markChanges(std::vector<TreeLine>& now, const std::vector<TreeLine>& before
     return any;
 }
 
-std::vector<ScreenLine> drawnLines(const std::vector<TreeLine>& lines) {
-    std::vector<ScreenLine> drawn;
-    drawn.reserve(lines.size());
-    for (const TreeLine& line : lines) {
-        drawn.push_back({std::string{markOf(line.change)} + line.margin + line.text,
-                         line.change == Change::none ? Style::plain : Style::changed});
+void keepMarks(std::vector<TreeLine>& now, const std::vector<TreeLine>& before) {
+    const LinesByPath earlier = byPath(before);
+    for (TreeLine& line : now) {
+        const auto found = earlier.find(line.path);
+        if (found != earlier.end() && found->second->change == Change::changed &&
+            line.change == Change::none) {
+            line.change = Change::changed;
+        }
     }
-    return drawn;
+    const LinesByPath present = byPath(now);
+    std::vector<TreeLine> gone;
+    for (const TreeLine& line : before) {
+        if (line.change == Change::gone && !present.contains(line.path)) {
+            gone.push_back(line);
+        }
+    }
+    now.insert(now.end(), gone.begin(), gone.end());
 }
 
 }  // namespace raidinfo

@@ -6,7 +6,6 @@
 
 #include "codebook/code_book.h"
 #include "inventory/tree.h"
-#include "watch/screen.h"
 
 namespace raidinfo {
 
@@ -23,11 +22,10 @@ struct TreeLine {
 [[nodiscard]] std::vector<TreeLine> treeLines(const Group& roots, const CodeBook& book);
 
 /// Marks what is new or reads otherwise than before, and adds what is gone as lines at the end.
-/// Returns whether there is any. Nothing is marked the first time, when there is no line before.
+/// Returns whether there is any.
 bool markChanges(std::vector<TreeLine>& now, const std::vector<TreeLine>& before);
 
-/// The lines as people see them: with "* " before what changed and "- " before what is gone, also
-/// without colours.
-[[nodiscard]] std::vector<ScreenLine> drawnLines(const std::vector<TreeLine>& lines);
+/// Marks again what was marked before, lest nobody have the time to see it.
+void keepMarks(std::vector<TreeLine>& now, const std::vector<TreeLine>& before);
 
 }  // namespace raidinfo

@@ -101,7 +101,8 @@ std::function<void()> saying(std::string_view text) {
 }
 
 [[noreturn]] void runUntilASecondSignal() {
-    const TerminalGuest guest{{saying("left"), saying("entered"), saying("abandoned")}};
+    const TerminalGuest guest{
+        {saying("left"), saying("entered"), saying("redrawn"), saying("abandoned")}};
     CancellableRun run;
     run.run(
         [](const std::stop_token&) {

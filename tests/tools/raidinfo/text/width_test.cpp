@@ -1,9 +1,12 @@
 #include "text/width.h"
 
+#include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
 namespace raidinfo {
 namespace {
+
+using testing::ElementsAre;
 
 TEST(DisplayWidth, CountsColumnsOfTheTerminal) {
     EXPECT_EQ(displayWidth(""), 0U);
@@ -29,6 +32,23 @@ TEST(ShortenedText, EndsWithASignThatItIsCut) {
 TEST(ShortenedText, CutsBetweenCharacters) {
     EXPECT_EQ(shortened("日本語", 4), "日…") << "a half of the second has no room";
     EXPECT_EQ(shortened("e\u0301a\u0301b", 2), "e\u0301…");
+}
+
+TEST(Folded, BreaksAtSpacesAndIndents) {
+    EXPECT_THAT(folded("* ", "one two three", 7), ElementsAre("* one", "  two", "  three"));
+    EXPECT_THAT(folded("* ", "one two", 80), ElementsAre("* one two"));
+    EXPECT_THAT(folded("└─ ", "one  two", 6), ElementsAre("└─ one", "   two"));
+}
+
+TEST(Folded, BreaksAWordThatIsTooLong) {
+    EXPECT_THAT(folded("", "äöüäöü", 4), ElementsAre("äöüä", "öü"));
+    EXPECT_THAT(folded("", "漢字", 3), ElementsAre("漢", "字"));
+}
+
+TEST(Folded, ComesToAnEndWithoutRoom) {
+    EXPECT_THAT(folded("12345", "ab", 4), ElementsAre("12345a", "  b"));
+    EXPECT_THAT(folded("", "ab", 0), ElementsAre("a", "b"));
+    EXPECT_THAT(folded("", "", 0), ElementsAre(""));
 }
 
 }  // namespace

@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "watch/picture.h"
+
 namespace raidinfo {
 namespace {
 
@@ -19,16 +21,44 @@ std::vector<TreeLine> lines(const std::vector<Node>& roots) {
 
 std::vector<std::string> texts(const std::vector<TreeLine>& lines) {
     std::vector<std::string> result;
-    for (const ScreenLine& line : drawnLines(lines)) {
+    for (const PictureLine& line : wholePicture({.above = {}, .tree = lines, .below = {}})) {
         result.push_back(line.text);
     }
     return result;
 }
 
-TEST(WatchedTree, MarksNothingTheFirstTime) {
-    auto now = lines({node("A", "ok", {node("B", "ok")})});
-    EXPECT_FALSE(markChanges(now, {}));
+TEST(WatchedTree, MarksNothingWhereNothingHasChanged) {
+    const auto before = lines({node("A", "ok", {node("B", "ok")})});
+    auto now = before;
+    EXPECT_FALSE(markChanges(now, before));
     EXPECT_THAT(texts(now), ElementsAre("  A: ok", "  └─ B: ok"));
+}
+
+TEST(WatchedTree, MarksWhatComesWhereNothingWas) {
+    auto now = lines({node("A", "ok", {node("B", "ok")})});
+    EXPECT_TRUE(markChanges(now, {}));
+    EXPECT_THAT(texts(now), ElementsAre("* A: ok", "* └─ B: ok"));
+}
+
+TEST(WatchedTree, MarksThatNothingIsLeft) {
+    std::vector<TreeLine> now;
+    EXPECT_TRUE(markChanges(now, lines({node("A", "ok")})));
+    EXPECT_THAT(texts(now), ElementsAre("- A: gone"));
+}
+
+TEST(WatchedTree, KeepsTheMarksOfALineThatReadsTheSameAndOfOneThatIsStillGone) {
+    const auto first = lines({node("A", "ok", {node("B", "ok"), node("C", "ok")})});
+    const auto changed = lines({node("A", "ok", {node("B", "bad")})});
+    auto second = changed;
+    markChanges(second, first);
+    auto third = changed;
+    EXPECT_FALSE(markChanges(third, second));
+    keepMarks(third, second);
+    EXPECT_THAT(texts(third), ElementsAre("  A: ok", "* └─ B: bad", "- A/C: gone"));
+    auto fourth = first;
+    EXPECT_TRUE(markChanges(fourth, third));
+    keepMarks(fourth, third);
+    EXPECT_THAT(texts(fourth), ElementsAre("  A: ok", "* ├─ B: ok", "* └─ C: ok"));
 }
 
 TEST(WatchedTree, MarksWhatReadsOtherwiseWhatIsNewAndWhatIsGone) {
