@@ -2,7 +2,6 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
-#include <chrono>
 #include <csignal>
 #include <cstdio>
 #include <fstream>
@@ -50,10 +49,10 @@ Result interrupt(Program& program, const ScriptedService& service, std::size_t c
 
 TEST(EventsCommand, ShowsEventsFromTheNewestOnUntilInterrupted) {
     const ScriptedService service{{newest(41), awaited(), answering(eventBatch({41})), newest(41),
-                                   awaited(), answering(eventBatch({42, 43})), newest(43),
-                                   waiting}};
+                                   awaited(), awaited(), answering(eventBatch({41, 42, 43})),
+                                   newest(43), waiting}};
     Program program{raidinfo({"events"})};
-    const Result result = interrupt(program, service, 7);
+    const Result result = interrupt(program, service, 8);
     const std::string tail =
         "  (code 0, adapter 0, channel 1, device 3, enclosure 0, logical drive 0, "
         "server -, address -)\n";
@@ -62,7 +61,9 @@ TEST(EventsCommand, ShowsEventsFromTheNewestOnUntilInterrupted) {
                                  "43  2006-10-02  Warning  event 43" + tail);
     EXPECT_EQ(result.errors, "");
     EXPECT_EQ(result.status, 130);
-    EXPECT_THAT(service.request(7), HasSubstr(">43</as:lastRetrieved>"));
+    EXPECT_THAT(service.request(4), HasSubstr(">41</as:lastRetrieved>"));
+    EXPECT_THAT(service.request(6), HasSubstr(">41</as:start>"));
+    EXPECT_THAT(service.request(8), HasSubstr(">43</as:lastRetrieved>"));
 }
 
 TEST(EventsCommand, WritesOneJsonDocumentPerLine) {
@@ -81,14 +82,12 @@ TEST(EventsCommand, WritesEventsAsSoonAsTheyCome) {
     EXPECT_EQ(interrupt(program, service, 4).status, 130);
 }
 
-TEST(EventsCommand, EndsAtOnceWhenInterruptedAndNotAfterTheSliceOfTheWait) {
+TEST(EventsCommand, EndsWhenItIsInterruptedInAWait) {
     const ScriptedService service{{newest(7), waiting}};
     Program program{raidinfo({"events"})};
     service.waitFor(1, Stage::answered);
-    const auto start = std::chrono::steady_clock::now();
     program.signal(SIGTERM);
     EXPECT_EQ(program.finish().status, 143);
-    EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::seconds{3});
 }
 
 TEST(EventsCommand, ShowsNothingTwiceWhenAWaitFails) {
@@ -178,12 +177,12 @@ TEST(EventsCommand, TakesNoDisorderForANewCount) {
 
 TEST(EventsCommand, ShowsAnEventThatComesLate) {
     const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5})), newest(5),
-                                   awaited(), answering(eventBatch({7})), newest(7), awaited(),
-                                   answering(eventBatch({6, 7})), newest(7), waiting}};
+                                   awaited(), awaited(), answering(eventBatch({7})), newest(7),
+                                   awaited(), answering(eventBatch({6, 7})), newest(7), waiting}};
     Program program{raidinfo({"events", "--json"})};
-    const Result result = interrupt(program, service, 10);
+    const Result result = interrupt(program, service, 11);
     EXPECT_THAT(numbers(result.output), ElementsAre(5, 7, 6));
-    EXPECT_THAT(service.request(8), HasSubstr(">6</as:start>"));
+    EXPECT_THAT(service.request(9), HasSubstr(">6</as:start>"));
 }
 
 TEST(EventsCommand, HandsNothingOutWhenItCannotKeepAccount) {
@@ -197,15 +196,14 @@ TEST(EventsCommand, PassesOverNumbersThatTheServiceNoLongerHas) {
     const Connection nothing = answering(eventBatch({}));
     const Connection last = answering(eventBatch({299, 300}));
     // When they have come, those that went missing last are looked for once more.
-    const ScriptedService service{{newest(300), awaited(), nothing, newest(300), awaited(), nothing,
-                                   newest(300), awaited(), last, newest(300), awaited(), last,
-                                   newest(300), waiting}};
+    const ScriptedService service{{newest(300), awaited(), nothing, last, newest(300), awaited(),
+                                   last, newest(300), awaited(), last, newest(300), waiting}};
     Program program{raidinfo({"events", "--json", "--since", "1"})};
-    const Result result = interrupt(program, service, 13);
+    const Result result = interrupt(program, service, 11);
     EXPECT_THAT(numbers(result.output), ElementsAre(299, 300));
-    EXPECT_THAT(service.request(5), HasSubstr(">102</as:start>"));
-    EXPECT_THAT(service.request(8), HasSubstr(">203</as:start>"));
-    EXPECT_THAT(service.request(11), HasSubstr(">201</as:start>"));
+    EXPECT_THAT(service.request(3), HasSubstr(">1</as:start><as:end xsi:type=\"xsd:int\">300</"));
+    EXPECT_THAT(service.request(6), HasSubstr(">299</as:start>"));
+    EXPECT_THAT(service.request(9), HasSubstr(">201</as:start>"));
     EXPECT_THAT(result.errors, HasSubstr("events 1 to 298 are missing"));
 }
 
@@ -249,6 +247,36 @@ TEST(EventsCommand, PassesOverAGapThatIsLongerThanWhatIsAskedForAtOnce) {
     EXPECT_THAT(numbers(result.output), ElementsAre(1, 2, 3, 4, 5, 300, 500));
     EXPECT_EQ(result.errors,
               "raidinfo: events 6 to 299 are missing\nraidinfo: events 301 to 499 are missing\n");
+}
+
+TEST(EventsCommand, FindsTheEventBehindAGapOfAnyLength) {
+    Simulator simulator{"small-server.xml"};
+    simulator.obey("event sequenceNumber=5");
+    simulator.command("event sequenceNumber=10000000\nevent sequenceNumber=2147483600");
+    const Result result = run({"events", "--json", "--since", "0", "--count", "4"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(5, 1000, 10'000'000, 2'147'483'600));
+    EXPECT_EQ(result.errors,
+              "raidinfo: events 6 to 999 are missing\n"
+              "raidinfo: events 1001 to 9999999 are missing\n"
+              "raidinfo: events 10000001 to 2147483599 are missing\n");
+}
+
+TEST(EventsCommand, WalksOnWhereTheServiceDoesNotAnswerTheSearchForTheNextEvent) {
+    const ScriptedService service{{newest(150), awaited(), answering(eventBatch({})), failing,
+                                   newest(150), awaited(), answering(eventBatch({150}))}};
+    const Result result = run({"events", "--json", "--since", "1", "--count", "1"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(150));
+    EXPECT_THAT(service.request(6), HasSubstr(">102</as:start>"));
+}
+
+TEST(EventsCommand, ShowsAnotherEventThatUsesTheLastNumberWhileItWaits) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event sequenceNumber=45 string=one");
+    Program program{raidinfo({"events", "--json", "--since", "45", "--count", "3"})};
+    program.waitForOutput("\n");
+    simulator.command("event place=last sequenceNumber=45 string=another");
+    simulator.command("event sequenceNumber=46");
+    EXPECT_THAT(numbers(program.finish().output), ElementsAre(45, 45, 46));
 }
 
 TEST(EventsCommand, TellsAGapBeforeTheEventBehindIt) {

@@ -56,8 +56,10 @@ public:
     /// The service has the same events as before, but none above this number.
     void shrinkTo(std::int64_t number);
 
-    /// There is nothing below this number, although there are events from it on.
+    /// There is nothing below this number, although there are events from it on; until the service
+    /// has none that far.
     void passOverTo(std::int64_t number) { asked = number; }
+    void heedNewest(std::int64_t newest) { asked = asked > newest ? 0 : asked; }
 
     /// The least number that is ahead.
     [[nodiscard]] std::int64_t next() const noexcept;

@@ -6,7 +6,10 @@
 #include <optional>
 #include <string>
 
+#include "agent/requests.h"
+#include "events/gap_search.h"
 #include "events/wait.h"
+#include "source/exchange.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
 #include "system/backoff.h"
@@ -29,6 +32,8 @@ class Follower {
 public:
     Follower(const Library& library, const StreamStart& start, const EventListener& told)
         : wait{library},
+          ask{library},
+          gap{library},
           askNewest{library.function<int()>("enableRAIDEvent")},
           nextNumber{library.variable<int>("nextSequenceNumber")},
           cancel{library.function<void()>("cancelGetEvent")},
@@ -42,9 +47,13 @@ public:
         }
         const auto last = continuity->last();
         const bool wentBack = last && newest < *last && newest != trusted;
-        const bool isAhead = last && (newest > *last || mayBeLate);
-        const std::int64_t from =
-            wentBack ? newest : (isAhead ? continuity->overlapping() : continuity->next());
+        if (last && newest <= *last && !wentBack && !mayBeLate && !isNextThere()) {
+            if (!stop.stop_requested()) {
+                examineFailure(Awaited::Outcome::failed, stop);
+            }
+            return true;
+        }
+        const std::int64_t from = wentBack ? newest : continuity->overlapping();
         const Awaited awaited = wait.from(from);
         if (stop.stop_requested()) {
             return true;
@@ -74,6 +83,7 @@ private:
         if (!continuity) {
             begin();
         }
+        continuity->heedNewest(newest);
         if (isAway) {
             isAway = false;
             trusted = -1;
@@ -121,6 +131,14 @@ private:
         backoff.wait(stop);
     }
 
+    /// Waits for an event behind the last one shown. The library's own wait would be followed by
+    /// the events from the same number on, so that an event which used the last number once more
+    /// meanwhile would be missed.
+    [[nodiscard]] bool isNextThere() const {
+        return ask(raid::agent::waitNextEventRequest(boundedNumber(continuity->next() - 1)))
+            .has_value();
+    }
+
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to
     /// count anew, and what it has is asked for from the beginning.
     bool isContinued(const Records& records, bool wentBack, std::int64_t last,
@@ -157,12 +175,18 @@ private:
         } else if (continuity->next() == before) {
             // Otherwise they were shown before the service lost them, and are there again.
             if (newest >= behind && (records.empty() || greatestNumber(records) < before)) {
-                continuity->passOverTo(behind);
+                passOver(before, behind, stop);
             } else {
                 backoff.wait(stop);
             }
         }
         return more;
+    }
+
+    /// The window that ends before `behind` holds nothing from `first` on.
+    void passOver(std::int64_t first, std::int64_t behind, const std::stop_token& stop) {
+        const auto least = gap.leastNumber(first, newest, stop);
+        continuity->passOverTo(least ? std::max(*least, first) : behind);
     }
 
     /// Whoever answers next may be another service, or the same that counts anew.
@@ -177,6 +201,8 @@ private:
     }
 
     EventWait wait;
+    Exchange ask;
+    GapSearch gap;
     int (*askNewest)();
     const int* nextNumber;  ///< the library's, which askNewest sets to the newest
     void (*cancel)();

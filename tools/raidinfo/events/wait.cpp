@@ -11,6 +11,9 @@
 namespace raidinfo {
 namespace {
 
+/// From a larger number on the library would ask for numbers beyond the largest.
+constexpr int lastAsked = std::numeric_limits<int>::max() - (numbersAsked - 1);
+
 /// No event has a number below 0.
 constexpr int markNumber = -1;
 
@@ -35,7 +38,7 @@ EventWait::EventWait(const Library& library)
 
 Awaited EventWait::from(std::int64_t number) {
     leaveMark();
-    setNext(static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max())));
+    setNext(static_cast<int>(std::min<std::int64_t>(number, lastAsked)));
     wait();
     if (*batch == nullptr) {
         return {Awaited::Outcome::malformed, {}};

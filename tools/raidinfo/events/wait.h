@@ -21,7 +21,8 @@ class EventWait {
 public:
     explicit EventWait(const Library& library);
 
-    /// For events from this number on. Ends early, and fails, when cancelGetEvent is called.
+    /// For events from this number on, or some numbers below where it is one of the largest. Ends
+    /// early, and fails, when cancelGetEvent is called.
     [[nodiscard]] Awaited from(std::int64_t number);
 
 private:

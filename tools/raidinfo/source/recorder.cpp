@@ -1,15 +1,12 @@
 #include "source/recorder.h"
 
-#include <algorithm>
 #include <cstdint>
-#include <cstdlib>
-#include <limits>
 #include <map>
-#include <memory>
 #include <string>
 #include <utility>
 
 #include "agent/requests.h"
+#include "source/exchange.h"
 #include "source/recorded.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
@@ -25,7 +22,7 @@ class Recorder {
 public:
     Recorder(const Library& loaded, const EntrySink& destination, std::stop_token whenOver)
         : library{loaded},
-          exchange{loaded.function<char*(const char*)>("_Z11getSOAPDataPKc")},
+          ask{loaded},
           askNewest{loaded.function<int()>("enableRAIDEvent")},
           newest{loaded.variable<int>("nextSequenceNumber")},
           reader{loaded},
@@ -62,7 +59,7 @@ public:
             isDoubtful = !recordAll();
             return false;
         }
-        if (newestNumber <= last && !ask(raid::agent::waitNextEventRequest(bounded(last)))) {
+        if (newestNumber <= last && !ask(raid::agent::waitNextEventRequest(boundedNumber(last)))) {
             isDoubtful = true;
             return false;
         }
@@ -70,15 +67,11 @@ public:
     }
 
 private:
-    static int bounded(std::int64_t number) {
-        return static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max()));
-    }
-
     /// The configuration is asked for after the events and written before them, so that it knows
     /// the names of all that they tell about.
     bool recordEventsUpTo(std::int64_t newestNumber) {
-        auto events =
-            ask(raid::agent::eventsRequest(bounded(last + 1), bounded(last + numbersAsked)));
+        auto events = ask(raid::agent::eventsRequest(boundedNumber(last + 1),
+                                                     boundedNumber(last + numbersAsked)));
         auto greatest = greatestIn(events);
         if (greatest == 0 && newestNumber > last + numbersAsked) {
             events = ask(raid::agent::eventListRequest);  // The numbers asked for are passed over.
@@ -102,17 +95,6 @@ private:
         return greatest.has_value();
     }
 
-    [[nodiscard]] std::optional<std::string> ask(const std::string& request) const {
-        struct Free {
-            void operator()(char* bytes) const {
-                std::free(
-                    bytes);  // NOLINT(cppcoreguidelines-no-malloc): the library's is malloc'ed
-            }
-        };
-        const std::unique_ptr<char, Free> body{exchange(request.c_str())};
-        return body ? std::optional<std::string>{body.get()} : std::nullopt;
-    }
-
     /// What says nothing new is not written, lest a service that fails again and again fill the
     /// disk. An exchange that was ended from here tells nothing of the service.
     void add(Question question, const std::optional<std::string>& body) {
@@ -133,7 +115,7 @@ private:
     }
 
     const Library& library;
-    char* (*exchange)(const char*);
+    Exchange ask;
     int (*askNewest)();
     const int* newest;  ///< the library's next number, which askNewest sets to the newest
     RecordReader reader;

@@ -6,6 +6,7 @@
 
 #include "events/event_line.h"
 #include "events/follower.h"
+#include "library/library.h"
 
 namespace raidinfo {
 namespace {
@@ -20,7 +21,12 @@ const EventListener silent{[](const Record& /*event*/) { return true; },
 std::int64_t LatestEvents::awaited(std::int64_t newest) const {
     const std::int64_t next = newest + 1;
     const bool isCounting = continuity && newest >= continuity->last().value_or(0);
-    return isCounting ? std::min(next, std::max<std::int64_t>(continuity->next(), 1)) : next;
+    if (!isCounting) {
+        return next;
+    }
+    // The newest must be among the numbers that the library asks for.
+    return std::clamp<std::int64_t>(continuity->next(),
+                                    std::max<std::int64_t>(next - numbersAsked, 1), next);
 }
 
 bool LatestEvents::take(const Records& batch, std::int64_t newest) {

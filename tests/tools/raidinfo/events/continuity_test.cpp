@@ -196,6 +196,15 @@ TEST(Continuity, AsksNotAgainWhereThereIsNothing) {
     EXPECT_EQ(continuity.next(), 501);
 }
 
+TEST(Continuity, AsksAgainBelowWhatItPassedOverOnceTheServiceHasNoneThatFar) {
+    Continuity continuity{1};
+    continuity.passOverTo(5'000);
+    continuity.heedNewest(6'000);
+    EXPECT_EQ(continuity.next(), 5'000);
+    continuity.heedNewest(8);
+    EXPECT_EQ(continuity.next(), 1);
+}
+
 TEST(Continuity, CountsBeyondTheLargestNumber) {
     Continuity continuity{2147483647};
     EXPECT_THAT(shownOf(continuity, {2147483647}), ElementsAre(2147483647));

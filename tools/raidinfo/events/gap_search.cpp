@@ -1,0 +1,48 @@
+#include "events/gap_search.h"
+
+#include <algorithm>
+
+#include "agent/requests.h"
+#include "source/recorded.h"
+
+namespace raidinfo {
+namespace {
+
+constexpr std::int64_t growth = 8;
+
+/// The least number of a batch from `first` on.
+std::optional<std::int64_t> leastIn(const Records& batch, std::int64_t first) {
+    std::optional<std::int64_t> least;
+    for (const Record& event : batch) {
+        const std::int64_t number = numberOf(eventKind(), event, "sequence_number");
+        if (number >= first) {
+            least = std::min(least.value_or(number), number);
+        }
+    }
+    return least;
+}
+
+}  // namespace
+
+GapSearch::GapSearch(const Library& searched)
+    : library{searched}, reader{searched}, ask{searched} {}
+
+std::optional<std::int64_t> GapSearch::leastNumber(std::int64_t first, std::int64_t last,
+                                                   const std::stop_token& stop) {
+    for (std::int64_t width = growth * numbersAsked; first <= last; width *= growth) {
+        const std::int64_t end = std::min(first + width - 1, last);
+        const auto answer =
+            ask(raid::agent::eventsRequest(boundedNumber(first), boundedNumber(end)));
+        const auto batch = answer ? eventsIn(library, reader, *answer) : std::nullopt;
+        if (!batch || stop.stop_requested()) {
+            return std::nullopt;
+        }
+        if (const auto least = leastIn(*batch, first)) {
+            return least;
+        }
+        first = end + 1;
+    }
+    return last;
+}
+
+}  // namespace raidinfo
