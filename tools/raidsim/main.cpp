@@ -5,6 +5,7 @@
 #include <string>
 
 #include "options.h"
+#include "process/standard_descriptors.h"
 #include "simulator.h"
 
 namespace {
@@ -26,6 +27,7 @@ int print(const std::string& text) {
 }  // namespace
 
 int main(int argc, char** argv) {
+    process::fillStandardDescriptors();
     // A reader of the output that goes away, or a terminal that belongs to another process, is
     // no reason to stop.
     std::signal(SIGPIPE, SIG_IGN);

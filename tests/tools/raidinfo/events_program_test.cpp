@@ -330,6 +330,17 @@ TEST(EventsCommand, LearnsThatTheProgramFailedAlsoWhereTheEndOfChildrenIsIgnored
     EXPECT_THAT(program.finish().errors, HasSubstr("ended with status 3"));
 }
 
+// What the program writes would otherwise go into one of raidinfo's own files.
+TEST(EventsCommand, RunsAProgramAlsoWithoutAStandardError) {
+    const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5}))}};
+    Program program{{"/bin/sh", "-c",
+                     "exec \"$0\" events --json --count 1 --exec 'echo written || exit 3' 2>&-",
+                     RAIDINFO_PROGRAM}};
+    const Result result = program.finish();
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(json::parse(result.output)["errors"], json::array());
+}
+
 TEST(EventsCommand, HandsEachEventToAProgram) {
     const ScriptedService service{{newest(5), awaited(), answering(eventBatch({5, 6}))}};
     const Result result = run({"events", "--count", "2", "--exec", "cat >>hook.out"});

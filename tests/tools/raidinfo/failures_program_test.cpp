@@ -56,6 +56,13 @@ TEST(FailingProgram, WritesOneDocumentThatSaysWhyForPrograms) {
     }
 }
 
+TEST(FailingProgram, KeepsItsStatusAndItsOutputWithoutAStandardError) {
+    Program program{{"/bin/sh", "-c", "exec \"$0\" tree --json 2>&-", RAIDINFO_PROGRAM}};
+    const Result result = program.finish();
+    EXPECT_EQ(result.status, 69);
+    EXPECT_EQ(json::parse(result.output)["errors"][0]["code"], "service_unavailable");
+}
+
 TEST(FailingProgram, SaysThatTheServiceClosesWithoutAnAnswer) {
     const ScriptedService service{{Connection{}, Connection{}}};
     expectFailure(run({"list"}), 69, "does not answer");

@@ -7,6 +7,7 @@
 
 #include <array>
 #include <csignal>
+#include <filesystem>
 #include <system_error>
 #include <utility>
 
@@ -36,6 +37,7 @@ public:
     void open(const char* path, int target) {
         posix_spawn_file_actions_addopen(&actions, target, path, O_WRONLY, 0);
     }
+    void close(int target) { posix_spawn_file_actions_addclose(&actions, target); }
     [[nodiscard]] const posix_spawn_file_actions_t* get() const { return &actions; }
 
 private:
@@ -44,7 +46,7 @@ private:
 
 }  // namespace
 
-Program::Program(const std::vector<std::string>& arguments, const char* outputFile)
+Program::Program(const std::vector<std::string>& arguments, const Streams& streams)
     : input(-1), output(-1), errors(-1) {
     auto [inputRead, inputWrite] = pipeEnds();
     auto [outputRead, outputWrite] = pipeEnds();
@@ -53,8 +55,10 @@ Program::Program(const std::vector<std::string>& arguments, const char* outputFi
     actions.place(inputRead, STDIN_FILENO);
     actions.place(outputWrite, STDOUT_FILENO);
     actions.place(errorsWrite, STDERR_FILENO);
-    if (outputFile != nullptr)
-        actions.open(outputFile, STDOUT_FILENO);
+    if (streams.outputFile != nullptr)
+        actions.open(streams.outputFile, STDOUT_FILENO);
+    for (const int descriptor : streams.closed)
+        actions.close(descriptor);
 
     std::vector<std::string> words{RAIDSIM_PROGRAM};
     words.insert(words.end(), arguments.begin(), arguments.end());
@@ -96,6 +100,11 @@ std::string Program::allOf(const Socket& stream) {
     for (char byte = 0; ::read(stream.get(), &byte, 1) == 1;)
         text += byte;
     return text;
+}
+
+std::string Program::fileOf(int descriptor) const {
+    return std::filesystem::read_symlink("/proc/" + std::to_string(process) + "/fd/" +
+                                         std::to_string(descriptor));
 }
 
 int Program::exitStatus() {

@@ -9,10 +9,16 @@
 
 namespace raidsim::test {
 
-// The program raidsim as a process of its own, its three streams on pipes, or its output in a file.
+// What a program has for its standard streams in place of pipes.
+struct Streams {
+    const char* outputFile = nullptr;
+    std::vector<int> closed{};
+};
+
+// The program raidsim as a process of its own, its three streams on pipes unless told otherwise.
 class Program {
 public:
-    explicit Program(const std::vector<std::string>& arguments, const char* outputFile = nullptr);
+    explicit Program(const std::vector<std::string>& arguments, const Streams& streams = {});
     ~Program();
     Program(const Program&) = delete;
     Program& operator=(const Program&) = delete;
@@ -26,6 +32,9 @@ public:
     // Everything up to the end of the program.
     [[nodiscard]] std::string readOutput() { return allOf(output); }
     [[nodiscard]] std::string readErrors() { return allOf(errors); }
+
+    // Where one of its descriptors leads, as long as it runs.
+    [[nodiscard]] std::string fileOf(int descriptor) const;
 
     [[nodiscard]] int exitStatus();
 

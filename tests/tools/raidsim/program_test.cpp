@@ -2,6 +2,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <unistd.h>
 
 #include <csignal>
 #include <string>
@@ -87,6 +88,19 @@ TEST_F(RunningProgram, HangupReloadsOrRefusesWithOneLine) {
               "raidsim: reload: system.xml: line 1: element \"ac:system\" is not closed; "
               "the old document stays");
     EXPECT_THAT(ask(port, getConfig), HasSubstr("<as:name>elm</as:name>"));
+}
+
+TEST_F(RunningProgram, KeepsThePlaceOfAnInputAndOfErrorsThatAreClosed) {
+    writeFile("play.scenario", "at 0 set adapter:9 state=4\nat 0 event type=Critical\n");
+    program.emplace(
+        std::vector<std::string>{"--port", "0", "--scenario", "play.scenario", "system.xml"},
+        Streams{.closed = {STDIN_FILENO, STDERR_FILENO}});
+    port = portIn(program->readLine());
+    EXPECT_THAT(ask(port, getNewestEvent()), HasSubstr(">1</as:return>"));
+    EXPECT_EQ(program->fileOf(STDIN_FILENO), "/dev/null");
+    EXPECT_EQ(program->fileOf(STDERR_FILENO), "/dev/null");
+    program->signal(SIGTERM);
+    EXPECT_EQ(program->exitStatus(), 0);
 }
 
 TEST_F(RunningProgram, InterruptEndsItAlthoughAClientWaits) {
@@ -238,7 +252,7 @@ TEST(Program, WritesAGeneratedDocumentAndEnds) {
 
 TEST(Program, SaysSoWhenItsOutputCannotBeWritten) {
     for (const char* const word : {"generate", "completion", "--help"}) {
-        Program program({word}, "/dev/full");
+        Program program({word}, {.outputFile = "/dev/full"});
         EXPECT_EQ(program.readErrors(), "raidsim: cannot write the output\n");
         EXPECT_EQ(program.exitStatus(), 74);
     }
