@@ -5,6 +5,7 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <filesystem>
 #include <string>
 #include <vector>
 
@@ -150,6 +151,20 @@ TEST(FaultAnswers, AreChangedLineByLine) {
     EXPECT_EQ(answered("header text \"\"\nbody keep 100"), "<good/>");
     writeFile("answer.xml", "<saved/>");
     EXPECT_EQ(answered("header text \"{length} {length} \"\nbody file answer.xml"), "8 8 <saved/>");
+}
+
+TEST(FaultAnswers, TakeFilesFromTheFoldersThatTheFaultFileNames) {
+    std::filesystem::create_directories("faults/answers");
+    writeFile("faults/answers/near.xml", "<near/>");
+    writeFile("far.xml", "<far/>");
+    const auto bodyFrom = [](const std::string& path) {
+        writeFile("faults/some.fault",
+                  "title \"Answers otherwise\"\nheader text \"\"\nbody file " + path + "\n");
+        return answerOf(FaultFile("faults/some.fault").at(0), "").bytes;
+    };
+    EXPECT_EQ(bodyFrom("answers/near.xml"), "<near/>");
+    EXPECT_EQ(bodyFrom("../far.xml"), "<far/>");
+    EXPECT_EQ(bodyFrom(std::filesystem::absolute("far.xml").string()), "<far/>");
 }
 
 TEST(FaultAnswers, AreRefusedWhereAChangeCannotBeMade) {

@@ -124,9 +124,7 @@ FaultFile::Variable FaultFile::variableOf(const std::vector<std::string>& words)
 }
 
 FaultFile::FaultFile(const std::string& path)
-    : fileName(std::filesystem::path(path).stem().string()) {
-    const auto parent = std::filesystem::path(path).parent_path();
-    folder = parent.empty() ? std::string() : parent.string() + "/";
+    : folder(folderOf(path)), fileName(std::filesystem::path(path).stem().string()) {
     const std::string text = readFile(path);
     std::size_t number = 0;
     for (const std::string_view line : split(text, '\n')) {

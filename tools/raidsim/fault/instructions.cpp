@@ -109,7 +109,8 @@ Change replaceFirst(const CaseBuilder&, const Words& words) {
 }
 
 Change becomeFile(const CaseBuilder& builder, const Words& words) {
-    return [path = builder.folder + words[0]](std::string& text) { text = readFile(path); };
+    return
+        [path = pathFrom(builder.folder, words[0])](std::string& text) { text = readFile(path); };
 }
 
 // What an instruction of several forms does, by its second word.
