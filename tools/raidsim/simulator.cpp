@@ -30,6 +30,7 @@ Simulator::Simulator(const Options& options, Startup startup, std::ostream& repl
       scenarioTimer(context),
       signals(context, SIGINT, SIGTERM, SIGHUP) {
     service.faults().tell = [this](const std::string& line) { out << line << std::endl; };
+    service.faults().complain = [this](const std::string& line) { complain(line); };
     if (!startup.warning.empty())
         complain(startup.warning);
     runInit(options.init);

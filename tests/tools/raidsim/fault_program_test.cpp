@@ -24,6 +24,9 @@ protected:
         writeFile("cut.fault",
                   "title \"Answers with less\"\nvary kept 1..2\nheader text \"\"\nbody text abc\n"
                   "body keep {kept}\n");
+        writeFile("mixed.fault",
+                  "title \"Has a mistake in its midst\"\nvary kept 1 many 2\nheader text \"\"\n"
+                  "body text abc\nbody keep {kept}\n");
         writeFile("stall.fault", "title \"Stalls\"\nsend nothing\nend stall\n");
         writeFile("deaf.fault", "title \"Answers at once\"\nread nothing\nbody text now\n");
         writeFile("refuse.fault", "title \"Is not there\"\nrefuse\n");
@@ -116,6 +119,18 @@ TEST_F(MisbehavingProgram, SaysWhyACaseCannotBePlayed) {
     EXPECT_EQ(line(), "fault: unfit case 0");
     EXPECT_EQ(line(), "fault: it cannot be played: the answer does not hold \"x<x\"");
     EXPECT_EQ(line(), "fault: over");
+}
+
+TEST_F(MisbehavingProgram, IsGoodAgainWhenTheNextCaseHasAMistake) {
+    start({"--fault", "mixed.fault"});
+    EXPECT_EQ(ask(port, getConfig), "a");
+    EXPECT_EQ(program->readErrorLine(),
+              "raidsim: fault: mixed case 1 cannot be played: line 5: \"many\" is not a number of "
+              "bytes");
+    for (int times = 0; times < 2; ++times)
+        EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+    type("fault mixed.fault");
+    EXPECT_EQ(ask(port, getConfig), "a");
 }
 
 TEST_F(MisbehavingProgram, RefusesACommandThatNamesNoCase) {

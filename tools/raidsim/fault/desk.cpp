@@ -30,16 +30,29 @@ void FaultDesk::prepare() {
         return;
     }
     auto chosen = armed->at(current);
-    std::string label = armed->name() + " case " + std::to_string(current);
+    std::string label = currentName();
     if (!chosen.values.empty())
         label += ": " + chosen.values;
     next = Play{std::move(chosen), std::move(label)};
 }
 
+void FaultDesk::prepareOrComplain() {
+    try {
+        prepare();
+    } catch (const FaultError& error) {
+        complain("fault: " + currentName() + " cannot be played: " + error.what());
+        armed.reset();
+    }
+}
+
+std::string FaultDesk::currentName() const {
+    return armed->name() + " case " + std::to_string(current);
+}
+
 std::optional<FaultDesk::Play> FaultDesk::take() {
     auto taken = std::exchange(next, std::nullopt);
     ++current;
-    prepare();
+    prepareOrComplain();
     changed();
     return taken;
 }

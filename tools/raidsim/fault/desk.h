@@ -33,11 +33,15 @@ public:
     [[nodiscard]] unsigned generation() const noexcept { return offs; }
 
     std::function<void(const std::string& line)> tell = [](const std::string&) {};
+    std::function<void(const std::string& line)> complain = [](const std::string&) {};
     std::function<void()> changed = [] {};  // refuses() may have become another
 
 private:
     void prepare();
+    // For when nobody is there whom an exception would reach: complains, and is disarmed.
+    void prepareOrComplain();
     [[nodiscard]] std::optional<Play> take();
+    [[nodiscard]] std::string currentName() const;
 
     std::shared_ptr<const FaultFile> armed;
     std::size_t current = 0;
