@@ -140,9 +140,7 @@ void Simulator::awaitStep() {
     const auto due = player.nextDue();
     if (clock != ClockKind::real || !due || quitting)
         return;
-    const auto scaled = std::chrono::duration<double, std::milli>(*due) / speed;
-    scenarioTimer.expires_at(scenarioStart +
-                             std::chrono::round<std::chrono::steady_clock::duration>(scaled));
+    scenarioTimer.expires_at(scenarioStart + realTime(*due, speed));
     scenarioTimer.async_wait([this, due = *due](boost::system::error_code cancelled) {
         if (cancelled)
             return;

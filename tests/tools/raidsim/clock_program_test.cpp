@@ -180,6 +180,19 @@ TEST(ProgramUnderTheRealClock, ReplaysAsFastAsItIsTold) {
     EXPECT_THAT(ask(port, waitNextEvent(0)), HasSubstr(">7</as:return>"));
 }
 
+TEST(ProgramUnderTheRealClock, WaitsForWhatIsRecordedLaterThanItCanCount) {
+    writeFile("day.rec", recording::heading("2026-11-21T17:48:00Z") +
+                             recording::written({0ms, Question::configuration, "<a/>"}) +
+                             recording::written({std::chrono::milliseconds::max(),
+                                                 Question::configuration, "<b/>"}));
+    Program program({"--replay", "day.rec", "--port", "0"});
+    const std::string line = program.readLine();
+    const auto port = static_cast<std::uint16_t>(std::stoi(line.substr(line.rfind(':') + 1)));
+    program.type("status\n");
+    EXPECT_THAT(program.readLine(), StartsWith("document day.rec, "));
+    EXPECT_EQ(bodyOf(ask(port, getConfig)), "<a/>");
+}
+
 TEST(ProgramUnderTheRealClock, RefusesToAdvance) {
     writeFile("system.xml", smallSystem());
     Program program({"--port", "0", "system.xml"});

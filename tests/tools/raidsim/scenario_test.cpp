@@ -217,6 +217,19 @@ TEST(Scenario, ClockShowsWhenAStepIsDue) {
     EXPECT_EQ(player.elapsed(), 7s);
 }
 
+TEST(RealTime, PassesSoManyTimesAsFast) {
+    EXPECT_EQ(realTime(1500ms, 1), 1500ms);
+    EXPECT_EQ(realTime(1h, 60), 1min);
+    EXPECT_EQ(realTime(1'000'000s, 0.001), 1'000'000'000s);
+}
+
+TEST(RealTime, IsOneThatTheClockCanCountHoweverLateTheStepIs) {
+    const auto longest = realTime(std::chrono::milliseconds::max(), 0.001);
+    EXPECT_GT(longest, std::chrono::years(50));
+    EXPECT_LT(std::chrono::steady_clock::now(), std::chrono::steady_clock::now() + longest);
+    EXPECT_EQ(realTime(std::chrono::milliseconds::max(), 1e6), longest);
+}
+
 // All events that a scenario leaves.
 std::string eventsAfter(std::string_view text, std::optional<std::uint64_t> seed = {}) {
     Service service = test::makeService(test::smallSystem());

@@ -5,6 +5,13 @@
 
 namespace raidsim {
 
+std::chrono::steady_clock::duration realTime(std::chrono::milliseconds shown, double speed) {
+    using Milliseconds = std::chrono::duration<double, std::milli>;
+    constexpr std::chrono::years never{100};
+    return std::chrono::round<std::chrono::steady_clock::duration>(
+        std::min(Milliseconds(shown) / speed, Milliseconds(never)));
+}
+
 ScenarioPlayer::ScenarioPlayer(std::vector<Step> steps) : list(std::move(steps)) {
     for (std::size_t step = 0; step < list.size(); ++step)
         next.push(dueOf(step, 0));

@@ -14,6 +14,11 @@
 
 namespace raidsim {
 
+// How long the real clock takes to show that time, so many times as fast. A recording may tell
+// times that no clock can count; they are as good as never.
+[[nodiscard]] std::chrono::steady_clock::duration realTime(std::chrono::milliseconds shown,
+                                                           double speed);
+
 // Plays steps as the time it is given passes; keeps no clock of its own.
 class ScenarioPlayer {
 public:
