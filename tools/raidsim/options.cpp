@@ -118,7 +118,8 @@ void addTime(CLI::App& app, Options& options) {
         options.clock, forms::clock());
     addValue(app, "--epoch", "Date (UTC) at which the virtual clock begins", options.epoch,
              forms::date());
-    addNumber(app, "--speed", "How much faster the real clock's time passes, 0.001 to 1000000",
+    addNumber(app, "--speed",
+              "How much faster the real clock moves scenario and recording, 0.001 to 1000000",
               options.speed, forms::factor());
     addValue(app, "--seed", "Seed of the scenario's choices in place of its own", options.seed,
              forms::number<std::uint64_t>("NUMBER", most<std::uint64_t>));
@@ -179,6 +180,10 @@ void checkTogether(const CLI::App& app, const Options& options) {
         throw UsageError("--epoch needs --clock virtual");
     if (!real && app.count("--speed") > 0)
         throw UsageError("--speed needs --clock real");
+    if (options.scenario.empty() && options.replay.empty() && app.count("--speed") > 0)
+        throw UsageError("--speed needs --scenario or --replay");
+    if (options.scenario.empty() && options.seed)
+        throw UsageError("--seed needs --scenario");
 }
 
 }  // namespace
