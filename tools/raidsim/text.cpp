@@ -42,6 +42,10 @@ std::optional<std::uint64_t> parseCount(std::string_view text) noexcept {
 
 std::optional<std::chrono::milliseconds> parseSeconds(std::string_view text) noexcept {
     constexpr double longest = 1e6;
+    constexpr std::size_t decimals = 3;
+    if (const auto point = text.find('.');
+        point != std::string_view::npos && text.size() - point - 1 > decimals)
+        return std::nullopt;
     double seconds = 0;
     const char* const end = text.data() + text.size();
     const auto [stop, error] = std::from_chars(text.data(), end, seconds, std::chars_format::fixed);

@@ -15,7 +15,9 @@ namespace raidsim {
 // A decimal number without a sign that fills the whole text, or nothing.
 [[nodiscard]] std::optional<std::uint64_t> parseCount(std::string_view text) noexcept;
 
-// A decimal number of seconds, perhaps with a fraction, up to a million; or nothing.
+// What parseSeconds() takes, for who must say that a word is "not " that.
+inline constexpr std::string_view secondsForm =
+    "a time of 0 to 1000000 seconds with at most three decimals";
 [[nodiscard]] std::optional<std::chrono::milliseconds> parseSeconds(std::string_view text) noexcept;
 
 // A time such as 12 or 12.5, without the zeros that tell nothing.

@@ -155,7 +155,9 @@ TEST_F(CommandLine, DownAndUpAreToldByStatus) {
 TEST_F(CommandLine, AdvanceIsForWhoKeepsTheClock) {
     EXPECT_EQ(carryOut("advance 2.5").advance, std::chrono::milliseconds(2500));
     EXPECT_EQ(carryOut("status").advance, std::nullopt);
-    EXPECT_EQ(errorOf("advance soon"), "advance: \"soon\" is not a time in seconds");
+    EXPECT_EQ(
+        errorOf("advance soon"),
+        "advance: \"soon\" is not a time of 0 to 1000000 seconds with at most three decimals");
 }
 
 TEST_F(CommandLine, ReloadServesTheFileAsItIsNow) {

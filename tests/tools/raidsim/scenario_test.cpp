@@ -82,15 +82,23 @@ TEST(Scenario, StepsActOnTheService) {
 }
 
 TEST(Scenario, ErrorsNameTheLine) {
+const std::string aTime = "a time of 0 to 1000000 seconds with at most three decimals";
+
     EXPECT_EQ(scenarioError("\nstatus"),
               "line 2: unknown statement \"status\"; a step starts with \"at SECONDS\" or "
               "\"from SECONDS\"");
-    EXPECT_EQ(scenarioError("at soon status"), "line 1: \"soon\" is not a time in seconds");
-    EXPECT_EQ(scenarioError("at -1 status"), "line 1: \"-1\" is not a time in seconds");
-    EXPECT_EQ(scenarioError("at nan status"), "line 1: \"nan\" is not a time in seconds");
-    EXPECT_EQ(scenarioError("at inf status"), "line 1: \"inf\" is not a time in seconds");
-    EXPECT_EQ(scenarioError("at 1000001 status"), "line 1: \"1000001\" is not a time in seconds");
-    EXPECT_EQ(scenarioError("at"), "line 1: \"\" is not a time in seconds");
+    EXPECT_EQ(scenarioError("at soon status"), "line 1: \"soon\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at -1 status"), "line 1: \"-1\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at nan status"), "line 1: \"nan\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at inf status"), "line 1: \"inf\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at 1000001 status"), "line 1: \"1000001\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at"), "line 1: \"\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at 1.0005 status"), "line 1: \"1.0005\" is not " + aTime);
+    EXPECT_EQ(scenarioError("at 1.005 status"), "none");
+    EXPECT_EQ(scenarioError("from 1 to 2 every 0.3333 status"),
+              "line 1: \"0.3333\" is not " + aTime);
+    EXPECT_EQ(scenarioError("from 1 to 2 every 1 jitter 0.2500 status"),
+              "line 1: \"0.2500\" is not " + aTime);
     EXPECT_EQ(scenarioError("at 1"), "line 1: the step has no command");
     EXPECT_EQ(scenarioError("at 2 status\nat 1 status"),
               "line 2: the step lies before the one above it");
@@ -106,7 +114,7 @@ TEST(Scenario, ErrorsOfRepeatsNameTheLine) {
     EXPECT_EQ(scenarioError("from 1 every 2 status"), usage);
     EXPECT_EQ(scenarioError("from 1 to 2 status"), usage);
     EXPECT_EQ(scenarioError("from 1"), usage);
-    EXPECT_EQ(scenarioError("from"), "line 1: \"\" is not a time in seconds");
+    EXPECT_EQ(scenarioError("from"), "line 1: \"\" is not " + aTime);
     EXPECT_EQ(scenarioError("from 2 to 1 every 1 status"),
               "line 1: the step ends before it begins");
     EXPECT_EQ(scenarioError("from 1 to 2 every 0 status"),

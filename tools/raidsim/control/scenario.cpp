@@ -52,7 +52,7 @@ std::chrono::milliseconds takeTime(std::string_view& rest) {
     const std::string_view word = takeWord(rest);
     const auto time = parseSeconds(word);
     if (!time)
-        throw CommandError("\"" + std::string(word) + "\" is not a time in seconds");
+        throw CommandError("\"" + std::string(word) + "\" is not " + std::string(secondsForm));
     return *time;
 }
 

@@ -45,7 +45,7 @@ Command up(const Arguments&) {
 Command advance(const Arguments& arguments) {
     const auto time = parseSeconds(arguments.words[0]);
     if (!time)
-        throw CommandError("\"" + arguments.words[0] + "\" is not a time in seconds");
+        throw CommandError("\"" + arguments.words[0] + "\" is not " + std::string(secondsForm));
     return [time](Service&) { return Outcome{.advance = time}; };
 }
 

@@ -240,7 +240,7 @@ void taken(CaseBuilder& builder, const Words&) { addStep(builder, {StepKind::tak
 void pause(CaseBuilder& builder, const Words& words) {
     const auto time = parseSeconds(words[1]);
     if (!time)
-        refuse(words[1], "a time in seconds");
+        refuse(words[1], std::string(secondsForm));
     addStep(builder, {StepKind::pause, 0, *time});
 }
 
