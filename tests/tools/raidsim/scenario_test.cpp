@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <array>
 #include <filesystem>
 #include <optional>
 #include <set>
@@ -81,9 +82,9 @@ TEST(Scenario, StepsActOnTheService) {
     EXPECT_EQ(service.events().newest(), 2);
 }
 
-TEST(Scenario, ErrorsNameTheLine) {
 const std::string aTime = "a time of 0 to 1000000 seconds with at most three decimals";
 
+TEST(Scenario, ErrorsNameTheLine) {
     EXPECT_EQ(scenarioError("\nstatus"),
               "line 2: unknown statement \"status\"; a step starts with \"at SECONDS\" or "
               "\"from SECONDS\"");
@@ -146,6 +147,30 @@ TEST(Scenario, EveryChoiceIsCheckedBeforeItIsPlayed) {
               "line 1: progress: \"101\" is neither a percentage nor \"done\"");
     EXPECT_EQ(scenarioError("at 1 {status|reboot}"), "line 1: unknown command \"reboot\"");
     EXPECT_EQ(scenarioError("at 1 set {drive} state=4"), "line 1: nothing is called {drive}");
+}
+
+TEST(Scenario, WhatNoDocumentCanHoldIsFoundBeforeItIsPlayed) {
+    raid::test::writeFile("two.fault", "title \"Two\"\nvary kept 1..2\nbody keep {kept}\n");
+    raid::test::writeFile("drive.xml", "<ac:hardDrive/>");
+    constexpr std::array<std::array<std::string_view, 2>, 11> mistakes{{
+        {"progress fan:1 50", "progress: no task runs on \"fan\""},
+        {"progress fan:1 done", "progress: no task runs on \"fan\""},
+        {"remove adapter:1", "remove: \"adapter\" is not added or removed while the system runs"},
+        {"remove {drive:1|spares}",
+         "remove: \"spares\" is not added or removed while the system runs"},
+        {"add adapter:1 like adapter:2",
+         "add: \"adapter\" is not added or removed while the system runs"},
+        {"add drive:1 like drive:2", "add: drive:1 does not say in which channel"},
+        {"add channel:1/drive:1 like fan:2", "add: fan:2 is no drive"},
+        {"add channel:1/drive:* from drive.xml", "add: channel:1/drive:* does not name one thing"},
+        {"join fan:1 spares", "join: fan:1 is not a drive"},
+        {"leave drive:1 adapter:1", "leave: adapter:1 is neither an array nor the spares"},
+        {"fault two.fault 2", "fault: there are 2 cases, counted from 0"},
+    }};
+    for (const auto& [command, complaint] : mistakes) {
+        EXPECT_EQ(scenarioError("at 1 status\nat 2 " + std::string(command)),
+                  "line 2: " + std::string(complaint));
+    }
 }
 
 TEST(Scenario, HeadsStandOnceBeforeTheSteps) {

@@ -13,8 +13,10 @@ namespace {
 
 template <void (*change)(Document&, const Path&, const Path&)>
 Command membership(const Arguments& arguments) {
-    return [drive = Path::parse(arguments.words[0]),
-            target = Path::parse(arguments.words[1])](Service& service) {
+    const Path drive = Path::parse(arguments.words[0]);
+    const Path target = Path::parse(arguments.words[1]);
+    checkMembership(drive, target);
+    return [drive, target](Service& service) {
         change(service.document(), drive, target);
         return Outcome{};
     };
@@ -32,6 +34,7 @@ Command set(const Arguments& arguments) {
 
 Command progress(const Arguments& arguments) {
     const Path path = Path::parse(arguments.words[0]);
+    checkProgress(path);
     const std::string& share = arguments.words[1];
     if (share == "done") {
         return [path](Service& service) {
@@ -55,8 +58,11 @@ Command leave(const Arguments& arguments) { return membership<raidsim::leave>(ar
 Command add(const Arguments& arguments) {
     const Path path = Path::parse(arguments.words[0]);
     const auto fields = arguments.fields(3);
+    checkPlug(path);
     if (arguments.words[1] == "like") {
-        return [path, model = Path::parse(arguments.words[2]), fields](Service& service) {
+        const Path model = Path::parse(arguments.words[2]);
+        checkPlugLike(path, model);
+        return [path, model, fields](Service& service) {
             plugLike(service.document(), path, model, fields);
             return Outcome{};
         };
@@ -72,7 +78,9 @@ Command add(const Arguments& arguments) {
 }
 
 Command remove(const Arguments& arguments) {
-    return [path = Path::parse(arguments.words[0])](Service& service) {
+    const Path path = Path::parse(arguments.words[0]);
+    checkUnplug(path);
+    return [path](Service& service) {
         unplug(service.document(), path);
         return Outcome{};
     };

@@ -22,6 +22,8 @@ Command fault(const Arguments& arguments) {
     if (words.size() > 1 && (!number || *number < 0))
         throw CommandError("\"" + words[1] + "\" is not the number of a case");
     const auto only = number ? std::optional(static_cast<std::size_t>(*number)) : std::nullopt;
+    if (only)
+        (void)file->at(*only);
     return [file, only](Service& service) {
         service.faults().arm(file, only);
         return Outcome{"fault: armed " + file->name()};

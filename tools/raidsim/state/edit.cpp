@@ -14,11 +14,6 @@ constexpr const char* hardDrive = "ac:hardDrive";
 constexpr const char* physicalDrives = "ac:physicalDrives";
 constexpr const char* channelId = "as:channelID";
 
-void requireProgress(const Path& path) {
-    if (!path.kind().takesProgress)
-        throw EditError("no task runs on \"" + std::string(path.kind().name) + "\"");
-}
-
 // The channel of that number in an array, or null.
 xml::Tree* channelIn(xml::Tree& physical, const std::string& id) {
     for (auto& [name, child] : physical) {
@@ -48,13 +43,6 @@ void enterChannel(std::vector<xml::Tree*>& way, const xml::Tree& original) {
     way.push_back(listed);
 }
 
-void requireCollection(const Path& drive, const Path& collection) {
-    if (drive.kind().name != "drive")
-        throw EditError(drive.text() + " is not a drive");
-    if (collection.kind().name != "array" && collection.kind().name != "spares")
-        throw EditError(collection.text() + " is neither an array nor the spares");
-}
-
 struct Membership {
     Match drive;
     std::vector<xml::Tree*> way;  // from the system to the collection
@@ -62,7 +50,7 @@ struct Membership {
 };
 
 Membership membership(xml::Tree& system, const Path& drive, const Path& target) {
-    requireCollection(drive, target);
+    checkMembership(drive, target);
     Membership found{findAtHome(system, drive), {}, {}};
     Match collection = findOne(system, target);
     found.way = std::move(collection.ancestors);
@@ -77,6 +65,18 @@ Membership membership(xml::Tree& system, const Path& drive, const Path& target) 
 }
 
 }  // namespace
+
+void checkProgress(const Path& path) {
+    if (!path.kind().takesProgress)
+        throw EditError("no task runs on \"" + std::string(path.kind().name) + "\"");
+}
+
+void checkMembership(const Path& drive, const Path& collection) {
+    if (drive.kind().name != "drive")
+        throw EditError(drive.text() + " is not a drive");
+    if (collection.kind().name != "array" && collection.kind().name != "spares")
+        throw EditError(collection.text() + " is neither an array nor the spares");
+}
 
 void setFields(Document& document, const Path& path, const Fields& fields) {
     std::vector<Match> matches = findSome(document.edit(), path);
@@ -100,7 +100,7 @@ void setFields(Document& document, const Path& path, const Fields& fields) {
 }
 
 void setProgress(Document& document, const Path& path, int percent) {
-    requireProgress(path);
+    checkProgress(path);
     for (const Match& match : findSome(document.edit(), path)) {
         match.node->erase(progress);
         xml::Tree task = xml::element("o:Progress");
@@ -110,7 +110,7 @@ void setProgress(Document& document, const Path& path, int percent) {
 }
 
 void clearProgress(Document& document, const Path& path) {
-    requireProgress(path);
+    checkProgress(path);
     for (const Match& match : findSome(document.edit(), path))
         match.node->erase(progress);
 }

@@ -8,6 +8,10 @@
 // no such object or field.
 namespace raidsim {
 
+// Throw EditError for what no document can hold, so that it shows before there is one.
+void checkProgress(const Path& path);
+void checkMembership(const Path& drive, const Path& collection);
+
 // Writes fields (named without "as:") in every listing that has them. A written overallStatus
 // rises: everything around the object then shows the worst overallStatus that it holds, until
 // it is written itself.

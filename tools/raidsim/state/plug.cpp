@@ -15,17 +15,10 @@ using Way = std::vector<xml::Tree*>;  // from the system to a list
 constexpr const char* logicalDrives = "ac:logicalDrives";
 constexpr const char* task = "ac:progress";
 
-void requirePluggable(const Path& path) {
-    if (path.kind().plugsInto.empty()) {
-        throw EditError("\"" + std::string(path.kind().name) +
-                        "\" is not added or removed while the system runs");
-    }
-}
-
 bool isLogical(const Path& path) { return path.kind().plugsInto == "adapter"; }
 
 Path placeOf(const Path& path) {
-    requirePluggable(path);
+    checkUnplug(path);
     if (path.id() == "*")
         throw EditError(path.text() + " does not name one thing");
     const std::string wanted(path.kind().plugsInto);
@@ -104,8 +97,23 @@ void enlist(xml::Tree& list, const std::string& element, const xml::Tree& thing)
 
 }  // namespace
 
+void checkUnplug(const Path& path) {
+    if (path.kind().plugsInto.empty()) {
+        throw EditError("\"" + std::string(path.kind().name) +
+                        "\" is not added or removed while the system runs");
+    }
+}
+
+void checkPlug(const Path& path) { (void)placeOf(path); }
+
+void checkPlugLike(const Path& path, const Path& model) {
+    checkPlug(path);
+    if (&model.kind() != &path.kind())
+        throw EditError(model.text() + " is no " + std::string(path.kind().name));
+}
+
 void unplug(Document& document, const Path& path) {
-    requirePluggable(path);
+    checkUnplug(path);
     for (const Match& match : findSome(document.edit(), path)) {
         xml::Tree& list = *match.ancestors.back();
         list.erase(std::ranges::find_if(
@@ -115,8 +123,7 @@ void unplug(Document& document, const Path& path) {
 }
 
 void plugLike(Document& document, const Path& path, const Path& model, const Fields& fields) {
-    if (&model.kind() != &path.kind())
-        throw EditError(model.text() + " is no " + std::string(path.kind().name));
+    checkPlugLike(path, model);
     plug(document, path, *findAtHome(document.edit(), model).node, fields);
 }
 

@@ -9,6 +9,11 @@
 // and logical drives. Each throws EditError, having changed nothing, when that is not possible.
 namespace raidsim {
 
+// Throw EditError for paths that fit no document, so that it shows before there is one.
+void checkUnplug(const Path& path);
+void checkPlug(const Path& path);
+void checkPlugLike(const Path& path, const Path& model);
+
 // Takes a thing, or all that the path names, out of every place where it is listed.
 void unplug(Document& document, const Path& path);
 
