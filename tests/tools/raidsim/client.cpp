@@ -6,6 +6,7 @@
 #include <boost/asio/read.hpp>
 #include <boost/asio/write.hpp>
 #include <boost/system/system_error.hpp>
+#include <stdexcept>
 
 namespace raidsim::test {
 
@@ -50,14 +51,18 @@ std::string Client::receive() {
     return received;
 }
 
-bool Client::isThere(short what) {
+bool Client::isThere(short what, int time) {
     pollfd look{socket.native_handle(), what, 0};
-    return ::poll(&look, 1, 0) != 0;
+    return ::poll(&look, 1, time) != 0;
 }
 
-bool Client::isAnswered() { return isThere(POLLIN); }
+bool Client::isAnswered() { return isThere(POLLIN, 0); }
 
-bool Client::isAnsweredInFull() { return isThere(POLLRDHUP); }
+void Client::awaitWholeAnswer() {
+    constexpr int patience = 60'000;
+    if (!isThere(POLLRDHUP, patience))
+        throw std::runtime_error("the service has not ended its answer");
+}
 
 std::string ask(std::uint16_t port, std::string_view request) {
     Client client(port);

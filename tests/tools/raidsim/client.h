@@ -19,11 +19,12 @@ public:
     [[nodiscard]] std::string receive();
     // Whether anything, be it the end, can be received at this moment.
     [[nodiscard]] bool isAnswered();
-    // Whether the service has sent all that it will.
-    [[nodiscard]] bool isAnsweredInFull();
+    // Returns when the service has sent all that it will. Throws std::runtime_error after a minute.
+    void awaitWholeAnswer();
 
 private:
-    [[nodiscard]] bool isThere(short what);
+    // Within the time, which is in milliseconds.
+    [[nodiscard]] bool isThere(short what, int time);
 
     boost::asio::io_context context;
     boost::asio::ip::tcp::socket socket{context};

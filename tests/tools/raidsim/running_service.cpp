@@ -1,12 +1,15 @@
 #include "running_service.h"
 
 #include <chrono>
+#include <stdexcept>
 
 #include "control/command.h"
 
 namespace raidsim::test {
 
 namespace {
+
+constexpr std::chrono::minutes patience{1};
 
 ServerSettings onFreePort(ServerSettings settings) {
     settings.port = 0;
@@ -68,13 +71,22 @@ RunningService::RunningService(ServerSettings settings, const std::string& docum
     : service(makeService(document)) {
     server.emplace(context, service, onFreePort(settings));
     listening = server->port();
-    thread = std::thread([this] { context.run(); });
+    thread = std::thread([this] { serve(); });
 }
 
 RunningService::~RunningService() {
     onService([this] { server->stop(); });
     work.reset();
     thread.join();
+}
+
+// Counts anew after everything that may have changed a count.
+void RunningService::serve() {
+    while (context.run_one() > 0) {
+        const std::lock_guard lock(mutex);
+        counts = {service.events().waiting(), server->clients()};
+        counted.notify_all();
+    }
 }
 
 void RunningService::command(std::string_view line) {
@@ -98,13 +110,18 @@ std::size_t RunningService::clients() {
 }
 
 void RunningService::awaitWaiting(std::size_t count) {
-    while (waiting() != count)
-        std::this_thread::yield();
+    await(&Counts::waiting, count, "clients that wait for an event");
 }
 
-void RunningService::awaitClients(std::size_t count) {
-    while (clients() != count)
-        std::this_thread::yield();
+void RunningService::awaitClients(std::size_t count) { await(&Counts::clients, count, "clients"); }
+
+void RunningService::await(std::size_t Counts::*which, std::size_t count, const char* what) {
+    onService([] {});  // What was done before is counted.
+    std::unique_lock lock(mutex);
+    if (!counted.wait_for(lock, patience, [&] { return counts.*which == count; })) {
+        throw std::runtime_error("there are " + std::to_string(counts.*which) + " in place of " +
+                                 std::to_string(count) + ' ' + what);
+    }
 }
 
 }  // namespace raidsim::test

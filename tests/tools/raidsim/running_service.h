@@ -3,7 +3,10 @@
 #include <boost/asio/executor_work_guard.hpp>
 #include <boost/asio/io_context.hpp>
 #include <boost/asio/post.hpp>
+#include <condition_variable>
+#include <cstddef>
 #include <future>
+#include <mutex>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -38,10 +41,19 @@ public:
     [[nodiscard]] std::size_t waiting();
     [[nodiscard]] std::size_t clients();
 
+    // Throw std::runtime_error when it is not so within a minute.
     void awaitWaiting(std::size_t count);
     void awaitClients(std::size_t count);
 
 private:
+    struct Counts {
+        std::size_t waiting = 0;
+        std::size_t clients = 0;
+    };
+
+    void serve();
+    void await(std::size_t Counts::*which, std::size_t count, const char* what);
+
     template <typename Action>
     auto onService(Action action) {
         std::packaged_task<decltype(action())()> task(std::move(action));
@@ -57,6 +69,9 @@ private:
     Service service;
     std::optional<Server> server;
     std::uint16_t listening;
+    std::mutex mutex;
+    std::condition_variable counted;
+    Counts counts;
     std::thread thread;
 };
 

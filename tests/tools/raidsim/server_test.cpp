@@ -7,7 +7,6 @@
 #include <memory>
 #include <optional>
 #include <string>
-#include <thread>
 #include <vector>
 
 #include "bounds.h"
@@ -240,8 +239,7 @@ TEST(Server, LeavesAnAnswerToWhoHasItWhenItGoesDown) {
     RunningService service;
     Client client(service.port());
     client.send(getConfig);
-    while (!client.isAnsweredInFull())
-        std::this_thread::yield();
+    client.awaitWholeAnswer();
     service.command("down");
     EXPECT_THAT(client.receive(), EndsWith("</env:Envelope>\n"));
 }
