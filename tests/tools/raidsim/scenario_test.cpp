@@ -173,6 +173,20 @@ TEST(Scenario, WhatNoDocumentCanHoldIsFoundBeforeItIsPlayed) {
     }
 }
 
+TEST(Scenario, LinesMayEndAsOnOtherSystemsAndTheLastOneNotAtAll) {
+    Played played("seed 7\r\nlet a help\r\n\r\nat 1 {a}\r\nat 2 status");
+    EXPECT_THAT(played.advanceTo(2s), ElementsAre(4, 5));
+}
+
+// A message ends at a zero byte.
+TEST(Scenario, ControlCharactersAreRefusedWhereverTheyStandButInComments) {
+    using namespace std::string_view_literals;
+    for (const auto line : {"at\0 1 status"sv, "at 1\0 status"sv, "at 1 sta\0tus"sv, "seed 7\0"sv,
+                            "let a\0b c"sv, "\0"sv, "at 1 status\rat 2 status"sv, "\x1b[2J"sv})
+        EXPECT_EQ(scenarioError("# \1\n" + std::string(line)), "line 2: a control character");
+    EXPECT_EQ(scenarioError("at\t1\tstatus"), "none");
+}
+
 TEST(Scenario, HeadsStandOnceBeforeTheSteps) {
     EXPECT_EQ(scenarioError("at 1 status\nseed 5"),
               "line 2: \"seed\" stands before the first step");

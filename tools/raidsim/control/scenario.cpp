@@ -15,6 +15,8 @@ namespace raidsim {
 
 namespace {
 
+constexpr bool isControl(char c) noexcept { return c >= '\0' && c < ' ' && c != '\t'; }
+
 // Calls use(number, line) for every line that is neither blank nor a comment.
 template <typename Use>
 void forEachLine(std::string_view text, Use use) {
@@ -25,6 +27,8 @@ void forEachLine(std::string_view text, Use use) {
         if (line.empty() || line.starts_with('#'))
             continue;
         try {
+            if (std::ranges::any_of(line, isControl))
+                throw CommandError("a control character");
             use(number, line);
         } catch (const CommandError& error) {
             throw ScriptError("line " + std::to_string(number) + ": " + error.what());
