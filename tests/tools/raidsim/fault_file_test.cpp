@@ -90,6 +90,13 @@ TEST(FaultFiles, StandForACaseForEveryCombinationOfTheirValues) {
     EXPECT_EQ(errorOf([&] { (void)file.at(6); }), "there are 6 cases, counted from 0");
 }
 
+// They are told in one line, also on a terminal.
+TEST(FaultFiles, SpellBytesThatAreNoLettersInTheNamesOfTheirCases) {
+    const auto file = fileOf("vary bytes \"a\\nb\" \"\\0\\x7f\\xfe\"\nbody text {bytes}\n");
+    EXPECT_EQ(file.at(0).values, "bytes=a\\x0Ab");
+    EXPECT_EQ(file.at(1).values, "bytes=\\x00\\x7F\\xFE");
+}
+
 TEST(FaultFiles, LeaveBracesAloneThatHoldNoName) {
     EXPECT_THAT(answered("body text \"{length} {} {Other} {a b} {open\""),
                 testing::EndsWith("\n\n{length} {} {Other} {a b} {open"));

@@ -62,6 +62,21 @@ std::vector<std::string> namesIn(const std::vector<std::string>& words) {
     return names;
 }
 
+// For people, who are told in one line.
+std::string spelled(std::string_view value) {
+    constexpr std::string_view digits = "0123456789ABCDEF";
+    std::string text;
+    for (const char c : value) {
+        const auto byte = static_cast<unsigned char>(c);
+        if (byte >= 0x20 && byte < 0x7f) {
+            text += c;
+        } else {
+            text.append("\\x").append(1, digits[byte / 16]).append(1, digits[byte % 16]);
+        }
+    }
+    return text;
+}
+
 template <typename Action>
 void inLine(std::size_t number, Action action) {
     try {
@@ -185,8 +200,8 @@ FaultCase FaultFile::at(std::size_t number) const {
         const std::string value = variable->at(number % variable->size());
         number /= variable->size();
         values.emplace_back("{" + variable->name + "}", value);
-        described.insert(
-            0, (variable + 1 == variables.rend() ? "" : ", ") + variable->name + "=" + value);
+        described.insert(0, (variable + 1 == variables.rend() ? "" : ", ") + variable->name + "=" +
+                                spelled(value));
     }
     CaseBuilder builder(folder);
     for (const Line& line : lines) {
