@@ -10,8 +10,17 @@
 
 namespace {
 
+// A file that is no text may be one word of megabytes, which the message names.
+std::string shortened(std::string message) {
+    constexpr std::size_t end = 500;
+    if (message.size() > 2 * end)
+        message.replace(end, message.size() - 2 * end, "...");
+    return message;
+}
+
 // On one line, whatever the command line holds.
-int leave(raidsim::ExitStatus status, std::string message) {
+int leave(raidsim::ExitStatus status, const std::string& complaint) {
+    std::string message = shortened(complaint);
     std::ranges::replace_if(
         message, [](char c) { return c >= '\0' && c < ' '; }, '?');
     std::cerr << "raidsim: " << message << std::endl;

@@ -15,6 +15,7 @@ namespace raidsim::test {
 namespace {
 
 using raid::test::writeFile;
+using testing::EndsWith;
 using testing::HasSubstr;
 using testing::MatchesRegex;
 using testing::StartsWith;
@@ -194,6 +195,17 @@ TEST(Program, FailsToStartWithOneLineAndAStatus) {
         EXPECT_THAT(program.readErrors(), MatchesRegex(message));
         EXPECT_EQ(program.exitStatus(), status) << message;
     }
+}
+
+TEST(Program, KeepsBeginningAndEndOfAComplaintAboutAVeryLongWord) {
+    writeFile("one-line.scenario", "at 1 " + std::string(3'000'000, 'x') + "\n");
+    Program program({"--scenario", "one-line.scenario", "system.xml"});
+    const std::string complaint = program.readErrors();
+    EXPECT_THAT(complaint, StartsWith("raidsim: one-line.scenario: line 1: unknown command \"xxx"));
+    EXPECT_THAT(complaint, HasSubstr("x...x"));
+    EXPECT_THAT(complaint, EndsWith("x\"\n"));
+    EXPECT_LT(complaint.size(), 1500U);
+    EXPECT_EQ(program.exitStatus(), 65);
 }
 
 struct WrongCommandLine {
