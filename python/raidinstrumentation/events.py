@@ -41,7 +41,8 @@ class EventStream(Iterator[Event]):
         self._follower = Follower(library, self._continuity)
         self._fetched: deque[Event | range] = deque()
         self._is_cancelled = False
-        self._call: Call[None] | None = None
+        # More than one only as long as a second thread is refused.
+        self._calls: set[Call[None]] = set()
 
     def __next__(self) -> Event:
         while not self._is_cancelled:
@@ -69,18 +70,22 @@ class EventStream(Iterator[Event]):
         Any thread may call it, and any signal handler.
         """
         self._is_cancelled = True
-        if self._call is not None:
-            self._call.cancel()
+        for call in tuple(self._calls):
+            call.cancel()
 
     def confirmation(self) -> Call[None]:
         """A call that raises EventLogRestarted if the service counts anew."""
         return self._call_for(self._follower.confirm)
 
     def _fetch(self) -> None:
-        self._call = self._call_for(self._follower.news)
-        if not self._is_cancelled:
-            with contextlib.suppress(CallCancelled):
-                self._call.result()
+        call = self._call_for(self._follower.news)
+        self._calls.add(call)
+        try:
+            if not self._is_cancelled:
+                with contextlib.suppress(CallCancelled):
+                    call.result()
+        finally:
+            self._calls.discard(call)
 
     def _call_for(self, look: Callable[[threading.Event], list[Event | range]]) -> Call[None]:
         # On the call's thread no signal handler can break it off between reading and keeping.

@@ -1,9 +1,10 @@
 """The entrance to the package."""
 
 import os
+import threading
 import weakref
 from types import TracebackType
-from typing import TypeVar
+from typing import Self, TypeVar
 
 from .calls import Call
 from .configuration import read_inventory
@@ -50,8 +51,10 @@ class RAIDInstrumentation:
         self._inventory: Inventory | None = None
         self._streams: weakref.WeakSet[EventStream] = weakref.WeakSet()
         self._is_closed = False
+        # Of these two. A signal handler may close what its thread is just about to add to.
+        self._lock = threading.RLock()
 
-    def __enter__(self) -> "RAIDInstrumentation":
+    def __enter__(self) -> Self:
         return self
 
     def __exit__(
@@ -64,8 +67,10 @@ class RAIDInstrumentation:
 
     def close(self) -> None:
         """Cancels the event streams. Afterwards nothing can be asked any more."""
-        self._is_closed = True
-        for stream in tuple(self._streams):
+        with self._lock:
+            self._is_closed = True
+            streams = tuple(self._streams)
+        for stream in streams:
             stream.cancel()
 
     def inventory(self, *, timeout: float | None = PATIENCE) -> Inventory:
@@ -108,8 +113,10 @@ class RAIDInstrumentation:
             stream = EventStream(library, after + 1, after)
             if newest < after:
                 self._result(stream.confirmation(), timeout)
-        self._streams.add(stream)
-        if self._is_closed:
+        with self._lock:
+            self._streams.add(stream)
+            is_closed = self._is_closed
+        if is_closed:
             stream.cancel()
         return stream
 

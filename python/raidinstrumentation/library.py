@@ -175,6 +175,8 @@ class Library:
 
 
 _libraries: dict[int, Library] = {}
+# In a child process nobody gives back the turns that threads of its parent had.
+os.register_at_fork(after_in_child=_libraries.clear)
 
 
 def load(path: str | os.PathLike[str] | None) -> Library:
