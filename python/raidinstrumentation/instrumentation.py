@@ -1,5 +1,6 @@
 """The entrance to the package."""
 
+import operator
 import os
 import threading
 import weakref
@@ -75,14 +76,17 @@ class RAIDInstrumentation:
 
     def inventory(self, *, timeout: float | None = PATIENCE) -> Inventory:
         """The inventory that was read last; reads it if there is none yet, as refresh does."""
+        _check(timeout)
         return self._inventory or self.refresh(timeout=timeout)
 
     def refresh(self, *, timeout: float | None = PATIENCE) -> Inventory:
         """Asks the service for the inventory, which inventory() then returns, too.
 
         Raises ServiceUnavailable, also after so many seconds without an answer (None waits without
-        limit), or MalformedAnswer; inventory() then returns what it did before.
+        limit), or MalformedAnswer; inventory() then returns what it did before. A timeout that is
+        no time, such as 0, is a ValueError.
         """
+        _check(timeout)
         library = self._library
         call = Call(lambda stopping: read_inventory(library, stopping), library.cancel)
         self._inventory = self._result(call, timeout)
@@ -99,7 +103,8 @@ class RAIDInstrumentation:
         whether the service still has the event with this number, and raises EventLogRestarted if
         not. The timeout is that of this call, not of the stream.
         """
-        if after is not None and not 0 <= after <= LARGEST_NUMBER:
+        _check(timeout)
+        if after is not None and not 0 <= operator.index(after) <= LARGEST_NUMBER:
             raise ValueError(f"event numbers range from 0 to {LARGEST_NUMBER}, unlike {after}")
         library = self._library
         newest = self._result(Call(library.newest_event, library.cancel), timeout)
@@ -127,3 +132,9 @@ class RAIDInstrumentation:
             return call.result(timeout)
         except TimeoutError:
             raise ServiceUnavailable(f"gave no answer within {timeout:g} seconds") from None
+
+
+def _check(timeout: float | None) -> None:
+    # NaN is not above 0, either.
+    if timeout is not None and not timeout > 0:
+        raise ValueError(f"a timeout is a number of seconds above 0, or None, unlike {timeout}")

@@ -6,6 +6,7 @@ from collections.abc import Callable
 from functools import partial
 from logging import WARNING
 from pathlib import Path
+from typing import Any
 
 import pytest
 from raidinstrumentation import (
@@ -143,6 +144,12 @@ def test_the_largest_number_there_is_can_be_followed(raid: RAIDInstrumentation) 
 @pytest.mark.parametrize("after", [-1, 2**31])
 def test_a_number_that_no_event_has_is_refused(raid: RAIDInstrumentation, after: int) -> None:
     with pytest.raises(ValueError, match="event numbers"):
+        raid.events(after)
+
+
+@pytest.mark.parametrize("after", [1.5, float("nan"), "1"])
+def test_what_is_no_event_number_is_refused(raid: RAIDInstrumentation, after: Any) -> None:
+    with pytest.raises(TypeError):
         raid.events(after)
 
 
