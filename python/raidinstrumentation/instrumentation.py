@@ -34,9 +34,9 @@ class RAIDInstrumentation:
     process's; it does not hold for other code of the process that calls the library by itself.
 
     Signals: the library is called on threads of its own, so that Ctrl-C works while the service is
-    waited for. They get none of the host's signals. To wake them, SIGURG is given a handler that
-    does nothing, unless it has a handler already. A process that forks must not use the parent's
-    objects in the child.
+    waited for. They get none of the host's signals but SIGURG, which wakes them and is given a
+    handler that does nothing, unless it has a handler already. A child process makes its own
+    objects, and is not forked while the inventory is asked for.
 
     Output: the library prints one line for each exchange with the service on standard output; see
     discarded_c_output. Memory that runs out inside the library ends the process.
