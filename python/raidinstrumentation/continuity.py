@@ -1,6 +1,6 @@
 """Account of the numbers of events: which were seen, which are missing, which are ahead."""
 
-from collections import OrderedDict
+from collections import deque
 from collections.abc import Iterable, Sequence
 from enum import Enum, auto
 
@@ -38,7 +38,10 @@ class Continuity:
         # Numbers below were asked for in vain.
         self._asked = 0
         self._missing: tuple[range, ...] = ()
-        self._shown: OrderedDict[int, set[int]] = OrderedDict()
+        # The contents of each number, and in which of the service's counts each was seen last.
+        self._shown: dict[int, dict[int, int]] = {}
+        self._order: deque[tuple[int, int]] = deque()
+        self._count = 0
 
     @property
     def next(self) -> int:
@@ -70,8 +73,8 @@ class Continuity:
                 self._last = max(self._last or 0, number)
             if is_fresh:
                 news.append(event)
-            if is_fresh or number == self._known:
-                self._remember(event)
+            if is_fresh or number == self._known or number in self._shown:
+                self._remember(number, hash(event))
         return news
 
     def compared(self, batch: Iterable[Event]) -> History:
@@ -83,11 +86,11 @@ class Continuity:
         for number, contents in sent.items():
             if self._last is None or number > self._last:
                 continue
-            shown = self._shown.get(number)
+            shown = self._seen_in_this_count(number)
             # One of several events with the same number may be new.
-            if shown is not None and shown.isdisjoint(contents):
+            if shown and shown.isdisjoint(contents):
                 return History.DIFFERENT
-            if shown is not None or number == self._known:
+            if shown or number == self._known:
                 history = History.SAME
         return history
 
@@ -96,6 +99,7 @@ class Continuity:
         self._expected = self._asked = 0
         self._known = self._last = None
         self._missing = ()
+        self._count += 1
 
     def shrink_to(self, number: int) -> None:
         """The service has the same events as before, but none above this number."""
@@ -152,7 +156,19 @@ class Continuity:
     def _replace_gap(self, place: int, parts: Sequence[range]) -> None:
         self._missing = (*self._missing[:place], *parts, *self._missing[place + 1 :])
 
-    def _remember(self, event: Event) -> None:
-        self._shown.setdefault(event.sequence_number, set()).add(hash(event))
-        if len(self._shown) > _MEMORY:
-            self._shown.popitem(last=False)
+    def _seen_in_this_count(self, number: int) -> set[int]:
+        shown = self._shown.get(number, {})
+        return {content for content, count in shown.items() if count == self._count}
+
+    def _remember(self, number: int, content: int) -> None:
+        shown = self._shown.setdefault(number, {})
+        if content not in shown:
+            self._order.append((number, content))
+        shown[content] = self._count
+        if len(self._order) > _MEMORY:
+            self._forget(*self._order.popleft())
+
+    def _forget(self, number: int, content: int) -> None:
+        del self._shown[number][content]
+        if not self._shown[number]:
+            del self._shown[number]

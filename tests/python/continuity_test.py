@@ -124,6 +124,23 @@ def test_what_was_seen_before_a_new_count_is_known_by_its_content() -> None:
     assert continuity.next == 5
 
 
+def test_what_was_seen_before_a_new_count_contradicts_nothing() -> None:
+    continuity = Continuity(1)
+    continuity.accept([event(2, "old"), event(3, "the same")])
+    continuity.begin_anew()
+    continuity.accept([event(1), event(3, "the same"), event(4)])
+    assert continuity.compared([event(2, "late")]) is History.UNKNOWN
+    assert continuity.compared([event(3, "another")]) is History.DIFFERENT
+
+
+def test_a_number_that_is_used_again_and_again_fills_no_memory() -> None:
+    continuity = Continuity(1)
+    for content in range(10_001):
+        continuity.accept([event(1, str(content))])
+    assert continuity.compared([event(1, "0")]) is History.DIFFERENT
+    assert continuity.compared([event(1, "1")]) is History.SAME
+
+
 def test_numbers_that_the_service_has_lost_are_expected_again() -> None:
     continuity = Continuity(1)
     lost, new = event(3, "lost"), event(3, "new")
