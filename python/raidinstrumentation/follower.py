@@ -11,6 +11,11 @@ from .records import Event
 from .text import TextBuffer
 
 LARGEST_NUMBER = 2**31 - 1
+# The library asks for a hundred more, and from further above its numbers would overflow.
+_HIGHEST_ASKED = LARGEST_NUMBER - NUMBERS_ASKED + 1
+# The search behind a gap begins with so many numbers, and goes on with so many times more.
+_NUMBERS_SEARCHED = 8 * NUMBERS_ASKED
+_WIDENING = 8
 # Pauses grow from the shortest one while nothing new comes, doubling so often.
 _SHORTEST_PAUSE = 0.1
 _DOUBLINGS = 6
@@ -24,8 +29,9 @@ class Follower:
     def __init__(self, library: Library, continuity: Continuity) -> None:
         self._library = library
         self._continuity = continuity
-        # For events that are missing or, after an outage, for one that was seen.
-        self._looks_back = False
+        # From where to look once more: for events that are missing, or for one that was seen, in
+        # place of which there may be another one after an outage, or another one beside it.
+        self._looks_back_to: int | None = None
         self._failed_reads = 0
         self._pauses = 0
 
@@ -56,17 +62,43 @@ class Follower:
         if batch is None:
             return None
         self._judge(batch, newest)
+        seen, expected = self._continuity.last, self._continuity.next
         news = self._continuity.accept(batch)
-        looked_back = self._looks_back
-        self._looks_back = bool(news) and self._continuity.waits_for_late_events()
+        looked_back = self._looks_back_to is not None
+        self._looks_back_to = None
         if news:
             self._pauses = 0
+            self._look_back_after_news(first, seen)
+        elif looked_back or self._continuity.next > expected:
+            pass  # There may be more.
         elif newest >= first + NUMBERS_ASKED:
-            # The service no longer keeps the events with these numbers.
-            self._continuity.pass_over_to(first + NUMBERS_ASKED)
-        elif not looked_back:
+            self._pass_over(first, newest, stopping)
+        else:
             self._pause(stopping)
         return news
+
+    def _look_back_after_news(self, first: int, seen: int | None) -> None:
+        if self._continuity.waits_for_late_events():
+            self._looks_back_to = self._continuity.overlapping()
+        if seen is not None and seen < first:
+            # While the next one was waited for, the last one may have been sent once more.
+            self._looks_back_to = min(self._looks_back_to or seen, seen)
+
+    def _pass_over(self, first: int, newest: int, stopping: threading.Event) -> None:
+        """The service no longer keeps the events with the numbers asked for, but some behind them."""
+        low, count = self._continuity.next, _NUMBERS_SEARCHED
+        while low <= newest and not stopping.is_set():
+            high = min(low + count - 1, newest)
+            there = self._library.numbers_between(low, high)
+            if there is None:
+                self._continuity.pass_over_to(first + NUMBERS_ASKED)
+                return
+            if there:
+                self._continuity.pass_over_to(min(there))
+                return
+            low, count = high + 1, count * _WIDENING
+        if not stopping.is_set():
+            self._continuity.pass_over_to(newest - NUMBERS_ASKED + 1)
 
     def _doubt_emptiness(self, stopping: threading.Event) -> None:
         """The service has no event any more, if it says so twice: an answer without a number reads
@@ -80,7 +112,7 @@ class Follower:
         be waited for in vain."""
         newest = self._library.newest_event(stopping)
         if newest is None:
-            self._looks_back = True
+            self._look_back()
             self._failed_reads = 0
             raise ServiceUnavailable
         if self._failed_reads == _MALFORMED_READS:
@@ -90,27 +122,37 @@ class Follower:
 
     def _first_asked(self, newest: int) -> int:
         continuity = self._continuity
+        if newest < continuity.next:
+            # The service has lost what the search behind a gap found there.
+            continuity.pass_over_to(0)
         seen = continuity.last
+        first = continuity.next
         if seen is not None:
             if newest < seen:
                 # A wait for what is above the last one would miss what the service counts from here.
-                return continuity.around(newest)
-            if newest > seen or self._looks_back:
-                return continuity.overlapping()
-        return continuity.next
+                first = continuity.around(newest)
+            elif self._looks_back_to is not None:
+                first = min(self._looks_back_to, continuity.overlapping())
+            elif newest > seen:
+                first = continuity.overlapping()
+        return min(first, _HIGHEST_ASKED)
 
     def _read(self, first: int, stopping: threading.Event) -> tuple[Event, ...] | None:
         cancels = self._library.cancels
-        if self._library.ask_for_events(min(first, LARGEST_NUMBER)):
+        if self._library.ask_for_events(first):
             self._failed_reads = 0
             with TextBuffer() as buffer:
                 return tuple(Event(**fields) for fields in self._library.read(Event, buffer))
-        self._looks_back = True
+        self._look_back()
         # That nothing came tells nothing after a cancel, be it that of another call.
         if self._library.cancels == cancels:
             self._failed_reads += 1
             self._pause(stopping)
         return None
+
+    def _look_back(self) -> None:
+        overlapping = self._continuity.overlapping()
+        self._looks_back_to = min(self._looks_back_to or overlapping, overlapping)
 
     def _judge(self, batch: Sequence[Event], newest: int) -> None:
         """Looks whether the service still tells of the events that were seen."""

@@ -11,6 +11,7 @@ from typing import Any
 from .calls import CallCancelled, prepare_wake_up
 from .errors import LibraryNotFound, LibraryUnusable
 from .inventory import KINDS
+from .ranges import numbers_in, request_for
 from .records import Event, Record
 from .shapes import Signature
 from .table import columns_of, count_of
@@ -26,14 +27,15 @@ GET_EVENT = Signature("getEvent", ctypes.c_int, ())
 CANCEL = Signature("cancelGetEvent", None, ())
 
 # The flat functions alone cannot tell an answer that never came from one that changed nothing, nor
-# ask for the newest event without moving the number that another thread's getEvent counts on. These
-# three can; they are C++ functions with plain types, declared in the installed headers
-# agent/envelope.h and agent/agent_link.h.
+# ask for the newest event without moving the number that another thread's getEvent counts on, nor
+# for more than a hundred numbers at once. These can; they are C++ functions with plain types,
+# declared in the installed headers agent/envelope.h, agent/agent_link.h and agent/exchange.h.
 PROCESS_CONFIGURATION = Signature(
     "_Z10processXMLPci", ctypes.c_int, (ctypes.c_void_p, ctypes.c_int)
 )
 PROCESS_EVENTS = Signature("_Z15processEventXMLPci", ctypes.c_int, (ctypes.c_void_p, ctypes.c_int))
 NEWEST_EVENT = Signature("_Z21getNewestEventRAIDXMLv", ctypes.c_int, ())
+EXCHANGE = Signature("_Z11getSOAPDataPKc", ctypes.c_void_p, (ctypes.c_char_p,))
 
 CALLS = (
     INIT,
@@ -44,6 +46,7 @@ CALLS = (
     PROCESS_CONFIGURATION,
     PROCESS_EVENTS,
     NEWEST_EVENT,
+    EXCHANGE,
 )
 
 _NO_ANSWER = -1
@@ -71,6 +74,8 @@ class Library:
         self._c_library = ctypes.CDLL(None)
         self._c_library.calloc.argtypes = (ctypes.c_size_t, ctypes.c_size_t)
         self._c_library.calloc.restype = ctypes.c_void_p
+        self._c_library.free.argtypes = (ctypes.c_void_p,)
+        self._c_library.free.restype = None
         self._inventory_lock = threading.Lock()
         self._event_lock = threading.Lock()
         self._initialised = False
@@ -137,6 +142,17 @@ class Library:
         self._call(SET_EVENT_NUMBER, first)
         self._call(GET_EVENT)
         return self._events.value is not None
+
+    def numbers_between(self, first: int, last: int) -> list[int] | None:
+        """The numbers of the events in a range, without waiting for any; None if that is unknown."""
+        answer = self._call(EXCHANGE, request_for(first, last))
+        if answer is None:
+            return None
+        try:
+            sent = numbers_in(ctypes.string_at(answer))
+        finally:
+            self._c_library.free(answer)
+        return None if sent is None else [number for number in sent if first <= number <= last]
 
     def newest_event(self, stopping: threading.Event) -> int | None:
         """The number of the service's newest event, 0 before the first; None without an answer.

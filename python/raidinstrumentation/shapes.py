@@ -9,7 +9,7 @@ from typing import Any, ClassVar, NamedTuple
 
 from .text import TextBuffer, decoded
 
-CType = type[ctypes.c_int] | type[ctypes.c_void_p]
+CType = type[ctypes.c_int] | type[ctypes.c_void_p] | type[ctypes.c_char_p]
 
 
 class OverallStatus(StrEnum):

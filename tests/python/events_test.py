@@ -1,17 +1,13 @@
 """The event stream: each event once, whatever happens."""
 
-import itertools
 import threading
 from collections.abc import Callable
 from functools import partial
-from logging import WARNING
 from pathlib import Path
 from typing import Any
 
 import pytest
 from raidinstrumentation import (
-    EventLogRestarted,
-    EventStream,
     MalformedAnswer,
     RAIDInstrumentation,
     ServiceUnavailable,
@@ -20,19 +16,11 @@ from support.documents import events, newest_event
 from support.interruption import meanwhile
 from support.scripted_service import Manner, ScriptedService
 from support.simulator import Simulator
+from support.streams import AWAITED, add, numbers_of, starts, take
 from support.waiting import PATIENCE
-
-# The answer to a wait is not looked at.
-AWAITED = "there are events"
-
 
 # By what an event says is noticed that the service counts anew.
 SAME_FOR_ALL = "date=2006-10-09T03:12:40Z"
-
-
-def numbers_of(raid: RAIDInstrumentation, after: int | None, count: int) -> list[int]:
-    stream = raid.events(after)
-    return [event.sequence_number for event in itertools.islice(stream, count)]
 
 
 def test_the_stream_starts_with_the_newest_event(raid: RAIDInstrumentation) -> None:
@@ -71,13 +59,6 @@ def test_more_events_than_are_asked_for_at_once_all_come(raid: RAIDInstrumentati
         assert numbers_of(raid, 0, count) == [*range(1, count + 1)]
 
 
-def test_events_that_are_no_longer_kept_are_passed_over(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        simulator.event("oldest that is kept", sequenceNumber=5000)
-        simulator.event("newest", sequenceNumber=5099)
-        assert numbers_of(raid, 17, 2) == [5000, 5099]
-
-
 def test_events_that_could_not_be_read_are_not_passed_over(raid: RAIDInstrumentation) -> None:
     with ScriptedService(
         newest=(newest_event(500),), wait=(AWAITED,), events=(Manner.CLOSE, events(1))
@@ -104,10 +85,7 @@ def test_events_come_once_and_each_batch_by_its_numbers(raid: RAIDInstrumentatio
     ) as service:
         assert numbers_of(raid, 40, 5) == [41, 42, 43, 44, 45]
         # With those that are new comes the last one seen.
-        assert [">40</as:start>", ">43</as:start>"] == [
-            request[request.index("</as:start>") - 3 :][:14]
-            for request in service.requests("events")
-        ]
+        assert starts(service) == [40, 43]
 
 
 # The library publishes the batch before it once more.
@@ -125,20 +103,6 @@ def test_an_empty_and_a_malformed_batch_are_got_over(raid: RAIDInstrumentation) 
         newest=(newest_event(4),), wait=(AWAITED,), events=("<", events(), "<", events(3, 4))
     ):
         assert numbers_of(raid, 2, 2) == [3, 4]
-
-
-def test_the_largest_number_there_is_can_be_followed(raid: RAIDInstrumentation) -> None:
-    largest = 2**31 - 1
-    with ScriptedService(
-        newest=(newest_event(largest),),
-        wait=(AWAITED, AWAITED, Manner.HOLD),
-        events=(events(largest),),
-    ) as service:
-        stream = raid.events()
-        assert next(stream).sequence_number == largest
-        with meanwhile(lambda: service.wait_for("wait", 3), stream.cancel):
-            assert not list(stream)
-        assert all(f">{largest}</as:start>" in request for request in service.requests("events"))
 
 
 @pytest.mark.parametrize("after", [-1, 2**31])
@@ -225,16 +189,6 @@ def test_nothing_is_lost_or_doubled_while_the_service_restarts(
     assert outages > 0
 
 
-def add(simulator: Simulator, *numbers: int) -> None:
-    """Has a service that counts wrong add events with these numbers."""
-    for number in numbers:
-        simulator.event(f"event {number}", place="last", sequenceNumber=number)
-
-
-def take(stream: EventStream, count: int) -> list[int]:
-    return [next(stream).sequence_number for _ in range(count)]
-
-
 def test_events_in_disorder_all_come(raid: RAIDInstrumentation) -> None:
     with Simulator("small-server.xml") as simulator:
         add(simulator, 1, 2, 3)
@@ -277,42 +231,26 @@ def test_what_went_missing_is_asked_for_again_when_more_comes(raid: RAIDInstrume
         assert ">6</as:start>" in service.requests("events")[-1]
 
 
-def test_numbers_that_are_passed_over_are_told_before_the_event_behind_them(
-    raid: RAIDInstrumentation, caplog: pytest.LogCaptureFixture
-) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 3, 5, 9)
-        stream = raid.events(2)
-        assert take(stream, 1) == [3]
-        assert caplog.record_tuples == []
-        assert take(stream, 1) == [5]
-        assert caplog.record_tuples == [("raidinstrumentation", WARNING, "event 4 is missing")]
-        assert take(stream, 1) == [9]
-        assert caplog.messages[1:] == ["events 6 to 8 are missing"]
-        assert stream.missing == (range(4, 5), range(6, 9))
-
-
-def test_what_the_service_no_longer_keeps_is_missing_only_after_a_number(
+def test_an_event_that_repeats_the_last_number_during_a_wait_comes(
     raid: RAIDInstrumentation,
 ) -> None:
     with Simulator("small-server.xml") as simulator:
-        add(simulator, 7)
-        from_the_oldest, resumed = raid.events(0), raid.events(4)
-        assert take(from_the_oldest, 1) == take(resumed, 1) == [7]
-        assert from_the_oldest.missing == ()
-        assert resumed.missing == (range(5, 7),)
-
-
-def test_more_numbers_than_are_asked_for_at_once_are_passed_over(
-    raid: RAIDInstrumentation,
-) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1, 2)
-        stream = raid.events(0)
-        assert take(stream, 2) == [1, 2]
-        add(simulator, 500)
-        assert take(stream, 1) == [500]
-        assert stream.missing == (range(3, 500),)
+        add(simulator, 45)
+        stream = raid.events()
+        assert take(stream, 1) == [45]
+        happen: tuple[Callable[[], None], ...] = (
+            simulator.wait_for_waiting_client,
+            lambda: simulator.event("another", place="last", sequenceNumber=45),
+            lambda: add(simulator, 46),
+            simulator.wait_for_waiting_client,
+            stream.cancel,
+        )
+        with meanwhile(*happen):
+            told = [*stream]
+    assert [(event.sequence_number, event.message_string) for event in told] == [
+        (46, "event 46"),
+        (45, "another"),
+    ]
 
 
 def test_another_event_with_a_number_that_was_seen_comes(raid: RAIDInstrumentation) -> None:
@@ -324,120 +262,6 @@ def test_another_event_with_a_number_that_was_seen_comes(raid: RAIDInstrumentati
         assert next(stream).message_string == "another"
         add(simulator, 4)
         assert take(stream, 1) == [4]
-
-
-def test_a_log_that_began_anew_is_told(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        simulator.event("first")
-        simulator.event("second")
-        stream = raid.events(0)
-        assert take(stream, 2) == [1, 2]
-    with Simulator("small-server.xml") as simulator:
-        simulator.event("first of another log")
-        with pytest.raises(EventLogRestarted) as told:
-            next(stream)
-        assert (told.value.newest, told.value.seen) == (1, 2)
-        with pytest.raises(EventLogRestarted):
-            raid.events(2)
-        assert next(raid.events(0)).message_string == "first of another log"
-
-
-def test_after_a_new_count_comes_all_that_was_not_seen(raid: RAIDInstrumentation) -> None:
-    with ScriptedService(
-        newest=(newest_event(3), newest_event(3), newest_event(2)),
-        wait=(AWAITED,),
-        events=(events(2, 3), events(2, message="another"), events(1, 2, message="another")),
-    ):
-        stream = raid.events(0)
-        assert take(stream, 2) == [2, 3]
-        with pytest.raises(EventLogRestarted):
-            next(stream)
-        assert [next(stream).message_string for _ in range(2)] == ["another 1", "another 2"]
-
-
-def test_a_new_count_is_noticed_when_it_has_caught_up(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1, 2)
-        stream = raid.events(0)
-        assert take(stream, 2) == [1, 2]
-    with Simulator("small-server.xml") as simulator:
-        for _ in range(3):
-            simulator.event("of another log")
-        with pytest.raises(EventLogRestarted) as told:
-            next(stream)
-        assert (told.value.newest, told.value.seen) == (3, 2)
-        assert take(stream, 3) == [1, 2, 3]
-
-
-def test_a_new_count_is_noticed_after_an_outage(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1)
-        stream = raid.events(0)
-        assert take(stream, 1) == [1]
-        with meanwhile(simulator.wait_for_waiting_client, simulator.kill):
-            with pytest.raises(ServiceUnavailable):
-                next(stream)
-    with Simulator("small-server.xml") as simulator:
-        simulator.event("of another log")
-        with pytest.raises(EventLogRestarted):
-            next(stream)
-        assert next(stream).message_string == "of another log"
-
-
-def test_a_new_count_is_noticed_before_the_first_event_came(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 7)
-        stream = raid.events()
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1)
-        with pytest.raises(EventLogRestarted):
-            next(stream)
-        assert take(stream, 1) == [1]
-
-
-def test_a_service_that_has_lost_all_events_counts_anew(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1, 2)
-        stream = raid.events(0)
-        assert take(stream, 2) == [1, 2]
-        simulator.command("forget")
-        with pytest.raises(EventLogRestarted):
-            raid.events(2)
-        with pytest.raises(EventLogRestarted):
-            next(stream)
-        simulator.event("new")
-        assert next(stream).message_string == "new"
-
-
-def test_an_answer_without_the_newest_number_is_no_new_count(raid: RAIDInstrumentation) -> None:
-    with ScriptedService(
-        newest=(newest_event(2), newest_event(2), newest_event("?"), newest_event(3)),
-        wait=(AWAITED,),
-        events=(events(2), events(2, 3)),
-    ):
-        assert take(raid.events(), 2) == [2, 3]
-
-
-def test_a_service_that_has_lost_its_last_events_counts_on(raid: RAIDInstrumentation) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 1, 2, 3)
-        stream = raid.events(0)
-        assert take(stream, 3) == [1, 2, 3]
-        simulator.command("forget 1")
-        happen = (simulator.wait_for_waiting_client, lambda: simulator.event("new"))
-        with meanwhile(*happen):
-            event = next(stream)
-        assert (event.sequence_number, event.message_string) == (2, "new")
-
-
-def test_a_stream_resumes_after_an_event_with_a_higher_number_than_the_newest(
-    raid: RAIDInstrumentation,
-) -> None:
-    with Simulator("small-server.xml") as simulator:
-        add(simulator, 50, 4)
-        stream = raid.events(50)
-        add(simulator, 51)
-        assert take(stream, 1) == [51]
 
 
 def test_a_second_thread_cannot_wait(raid: RAIDInstrumentation) -> None:
