@@ -1,8 +1,10 @@
 #include <algorithm>
+#include <cstdint>
 #include <iterator>
 #include <utility>
 
 #include "health/condition.h"
+#include "health/contradiction.h"
 #include "settings/table_reader.h"
 #include "text/enumerated.h"
 
@@ -92,6 +94,7 @@ private:
     void addOperand(const Setting& setting) {
         switch (field.type) {
             case FieldType::number:
+            case FieldType::count:
                 return addNumber(setting);
             case FieldType::flag:
                 return add(flagOf(setting), flagOf(setting) ? "true" : "false");
@@ -107,6 +110,7 @@ private:
     void addNumber(const Setting& setting) {
         if (!std::holds_alternative<std::string>(setting.value)) {
             const int number = numberOf(setting);
+            requireReachable(setting, number);
             return add(number, std::to_string(number));
         }
         const std::string& name = textOf(setting);
@@ -130,6 +134,12 @@ private:
         }
     }
 
+    void requireReachable(const Setting& setting, std::int64_t number) const {
+        if (field.type == FieldType::count && number < 0) {
+            refuse(setting.place, qualified + " is a count, and never below 0");
+        }
+    }
+
     void addWord(const Setting& setting) {
         const std::string& name = textOf(setting);
         if (std::ranges::find(field.words, name) == field.words.end()) {
@@ -141,10 +151,12 @@ private:
     }
 
     void addBound(const Setting& setting) {
-        if (field.type != FieldType::number) {
+        if (field.type != FieldType::number && field.type != FieldType::count) {
             refuse(setting.place, qualified + " is no number");
         }
         const int bound = numberOf(setting);
+        requireReachable(setting,
+                         result.comparison == Operator::below ? std::int64_t{bound} - 1 : bound);
         add(bound, std::to_string(bound));
     }
 
@@ -212,6 +224,10 @@ std::vector<Condition> readConditions(const Setting& setting, std::string_view k
     }
     if (conditions.empty()) {
         refuse(setting.place, "the list of conditions is empty");
+    }
+    const std::string contradiction = contradictionIn(conditions);
+    if (!contradiction.empty()) {
+        refuse(setting.place, "the conditions exclude each other: " + contradiction);
     }
     return conditions;
 }

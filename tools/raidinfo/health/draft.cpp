@@ -36,8 +36,27 @@ std::vector<Draft> draftsIn(const settings::Setting* list, const std::string& wh
     return drafts;
 }
 
+/// Tells of the setting as if it stood at this place.
+void standAt(settings::Setting& setting, const settings::Place& at) {
+    setting.place = at;
+    if (auto* const list = std::get_if<settings::List>(&setting.value)) {
+        for (settings::Setting& element : *list) {
+            standAt(element, at);
+        }
+    } else if (auto* const table = std::get_if<settings::Table>(&setting.value)) {
+        for (settings::Entry& entry : *table) {
+            standAt(entry.setting, at);
+        }
+    }
+}
+
+/// What is wrong with the whole is for the author of the change to mend, so that everything stands
+/// where the change does.
 void amend(Draft& draft, const Draft& change) {
     draft.place = change.place;
+    for (settings::Entry& entry : draft.table) {
+        standAt(entry.setting, draft.place);
+    }
     for (const settings::Entry& entry : change.table) {
         const auto replaced = std::ranges::find(draft.table, entry.key, &settings::Entry::key);
         if (replaced == draft.table.end()) {

@@ -2,18 +2,10 @@
 
 #include <algorithm>
 
+#include "health/containment.h"
 #include "health/vocabulary.h"
 
 namespace raidinfo::health {
-namespace {
-
-bool isArray(const Subject& subject) {
-    return subject.kind == kindOf(KindId::array).key ||
-           subject.kind == kindOf(KindId::spannedArray).key;
-}
-
-}  // namespace
-
 Evidence::Evidence(const Group& adapters, const std::vector<Count>& countsOfPolicy,
                    const CodeBook& codeBook)
     : records{subjectsOf(adapters)}, counts{countsOfPolicy}, book{codeBook} {}
@@ -76,7 +68,7 @@ std::optional<std::size_t> Evidence::containerOf(std::size_t index, Count::Withi
         return line.front();
     }
     const auto array = std::find_if(line.rbegin(), line.rend(), [this](std::size_t candidate) {
-        return isArray(records[candidate]);
+        return isArray(records[candidate].kind);
     });
     return array == line.rend() ? std::nullopt : std::optional{*array};
 }

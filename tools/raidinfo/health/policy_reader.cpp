@@ -2,6 +2,7 @@
 #include <array>
 #include <utility>
 
+#include "health/containment.h"
 #include "health/draft.h"
 #include "health/policy.h"
 #include "health/vocabulary.h"
@@ -67,6 +68,12 @@ Count readCount(const Draft& draft, const CodeBook& book) {
     count.when = readConditions(reader.need("when"), count.of, ruleFields(count.of), book);
     reader.finish();
     for (const std::string& kind : count.on) {
+        if (!canBeWithin(count.of, count.within, kind)) {
+            refuse(reader.need("of").place,
+                   "there are no " + count.of + " within the " +
+                       std::string{withinWords[static_cast<std::size_t>(count.within)]} + " of " +
+                       kind);
+        }
         const auto fields = ruleFields(kind);
         if (std::ranges::find(fields, count.name, &RuleField::key) != fields.end()) {
             refuse(draft.place, "the kind " + kind + " has a field of this name");
@@ -80,7 +87,7 @@ std::vector<RuleField> fieldsWithCounts(const std::string& kind, const std::vect
     auto fields = ruleFields(kind);
     for (const Count& count : counts) {
         if (std::ranges::find(count.on, kind) != count.on.end()) {
-            fields.push_back({count.name, FieldType::number});
+            fields.push_back({count.name, FieldType::count});
         }
     }
     return fields;

@@ -15,6 +15,7 @@ constexpr std::string_view arrayMembers = "members";
 /// What a field can be compared with.
 enum class FieldType : std::uint8_t {
     number,  ///< a code, if the code book has codes for it
+    count,   ///< a number that the policy counts
     flag,
     text,
     word,     ///< one of a few, or unknown

@@ -1,6 +1,9 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include <array>
+#include <utility>
+
 #include "exit_status.h"
 #include "health/policy.h"
 #include "settings/document.h"
@@ -87,7 +90,17 @@ INSTANTIATE_TEST_SUITE_P(
                     "adapter_id"},
         WrongPolicy{"field_of_one_of_the_kinds",
                     "[[rule]]\nname = \"fan-critical\"\nkind = [\"fans\", \"channels\"]",
-                    ": unknown field of channels \"status\""},
+                    "site.toml:2: unknown field of channels \"status\""},
+        WrongPolicy{"condition_of_a_default_for_another_kind",
+                    "[[rule]]\nname = \"fan-critical\"\nkind = \"enclosures\"",
+                    "site.toml:2: unknown field of enclosures \"status\""},
+        WrongPolicy{"message_of_a_default_for_another_kind",
+                    "[[rule]]\nname = \"fan-critical\"\nkind = \"enclosures\"\n"
+                    "when = { field = \"state\", is = \"absent\" }",
+                    "site.toml:2: unknown field of enclosures \"status\""},
+        WrongPolicy{"condition_of_a_default_count_for_another_kind",
+                    "[[count]]\nname = \"ready_spares\"\nof = \"fans\"",
+                    "site.toml:2: unknown field of fans \"hot_spare\""},
         WrongPolicy{"no_field", "[[rule]]\nname = \"fan-critical\"\nwhen = { is = 1 }",
                     "site.toml:3: condition lacks \"field\""},
         WrongPolicy{"operator",
@@ -170,11 +183,79 @@ INSTANTIATE_TEST_SUITE_P(
                     "[[count]]\nname = \"status\"\non = \"fans\"\nof = \"fans\"\n"
                     "within = \"adapter\"\nwhen = { field = \"status\", is = 1 }",
                     "site.toml:2: the kind fans has a field of this name"},
+        WrongPolicy{"count_of_what_stands_in_no_adapter",
+                    wrongCount("on = \"fans\"\nof = \"adapters\"\nwithin = \"adapter\"\n"
+                               "when = { field = \"family\", known = true }"),
+                    "site.toml:4: there are no adapters within the adapter of fans"},
+        WrongPolicy{"count_of_what_stands_in_no_array",
+                    wrongCount("on = \"arrays\"\nof = \"disk_drives\"\nwithin = \"array\"\n"
+                               "when = { field = \"hot_spare\", is = true }"),
+                    "site.toml:4: there are no disk_drives within the array of arrays"},
+        WrongPolicy{"count_on_what_belongs_to_no_array",
+                    wrongCount("on = [\"arrays\", \"adapters\"]\nof = \"members\"\n"
+                               "within = \"array\"\nwhen = { field = \"present\", is = true }"),
+                    "site.toml:4: there are no members within the array of adapters"},
+        WrongPolicy{"count_of_arrays_in_an_array_of_drives",
+                    wrongCount("on = \"members\"\nof = \"arrays\"\nwithin = \"array\"\n"
+                               "when = { field = \"size\", is = 1 }"),
+                    "site.toml:4: there are no arrays within the array of members"},
+        WrongPolicy{"count_with_conditions_that_exclude_each_other",
+                    wrongCount("on = \"adapters\"\nof = \"fans\"\nwithin = \"adapter\"\n"
+                               "when = [\n{ field = \"status\", is = \"critical\" },\n"
+                               "{ field = \"status\", is = \"warning\" }]"),
+                    "site.toml:6: the conditions exclude each other: status is critical and status "
+                    "is warning"},
+        WrongPolicy{"number_out_of_the_bounds",
+                    "[[rule]]\nname = \"fan-critical\"\nwhen = [{ field = \"index\", above = 2 }, "
+                    "{ field = \"index\", below = 3 }]",
+                    "site.toml:3: the conditions exclude each other: index is above 2 and index is "
+                    "below 3"},
+        WrongPolicy{"count_below_nothing",
+                    "[[rule]]\nname = \"hot-spare-missing\"\n"
+                    "when = { field = \"ready_spares\", below = 0 }",
+                    "site.toml:3: adapters.ready_spares is a count, and never below 0"},
+        WrongPolicy{"count_of_less_than_nothing",
+                    "[[rule]]\nname = \"hot-spare-missing\"\n"
+                    "when = { field = \"ready_spares\", in = [0, -1] }",
+                    "site.toml:3: adapters.ready_spares is a count, and never below 0"},
         WrongPolicy{"count_on_another_kind",
                     "[[rule]]\nname = \"fan-critical\"\n"
                     "when = { field = \"ready_spares\", is = 1 }",
                     "site.toml:3: unknown field of fans \"ready_spares\""}),
     raid::test::nameOfRow);
+
+// What a spanned array and its logical drives hold are arrays, too.
+TEST(PolicyFile, MayCountWhateverAnArrayHolds) {
+    for (const auto& [on, of] :
+         std::to_array<std::pair<std::string, std::string>>({{"arrays", "members"},
+                                                             {"arrays", "logical_drives"},
+                                                             {"logical_drives", "members"},
+                                                             {"logical_drives", "arrays"},
+                                                             {"members", "logical_drives"},
+                                                             {"spanned_arrays", "arrays"},
+                                                             {"spanned_arrays", "spanned_arrays"},
+                                                             {"spanned_arrays", "members"}})) {
+        const std::string field = of == "members" ? "device_id" : "array_id";
+        EXPECT_NO_THROW(
+            policyOf(wrongCount("on = \"" + on + "\"\nof = \"" + of + "\"\nwithin = \"array\"\n" +
+                                "when = { field = \"" + field + "\", above = 0 }")))
+            << of << " on " << on;
+    }
+}
+
+TEST(PolicyFile, MaySpeakSeveralTimesOfAField) {
+    for (const char* const conditions :
+         {"{ field = \"status\", not = \"critical\" }, { field = \"status\", not = \"warning\" }",
+          "{ field = \"status\", known = true }, { field = \"status\", above = 0 }",
+          "{ field = \"status\", known = false }, { field = \"status\", not = 7 }",
+          "{ field = \"index\", above = 2 }, { field = \"index\", below = 4 }",
+          "{ field = \"index\", at_least = 2147483647 }, { field = \"index\", not = 0 }",
+          "{ field = \"fan_name\", not = \"a\" }, { field = \"fan_name\", not_in = [\"\"] }"}) {
+        EXPECT_NO_THROW(
+            policyOf("[[rule]]\nname = \"fan-critical\"\nwhen = [" + std::string{conditions} + "]"))
+            << conditions;
+    }
+}
 
 TEST(PolicyFile, MayDisableARuleThatSpeaksOfWhatTheCodeBookLacks) {
     CodeBook book = shippedCodeBook();
