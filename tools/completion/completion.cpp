@@ -77,6 +77,9 @@ complete -F _@PROGRAM@ @PROGRAM@
 
 constexpr std::string_view splitList =
     R"(            prefix=${current%"${current##*[,+]}"} current=${current##*[,+]}
+            for word in ${prefix//[,+]/ }; do
+                offered=" $offered " offered=${offered// $word / }
+            done
 )";
 
 constexpr std::string_view withoutBlank = R"(            compopt -o nospace 2>/dev/null
@@ -203,6 +206,8 @@ std::string valueCases(const std::vector<Values>& all) {
         }
         if (values.form == Form::list)
             cases += splitList;
+        if (!values.alone.empty())
+            cases += "            [[ $prefix ]] || " + addition(values.alone) + "\n";
         if (values.form == Form::start)
             cases += withoutBlank;
         cases += "            ;;\n";

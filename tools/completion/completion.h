@@ -14,7 +14,7 @@ using Words = std::vector<std::string>;
 enum class Form : std::uint8_t {
     file,   ///< the value is the name of a file
     word,   ///< the value is one of the words
-    list,   ///< it is words with commas between them, perhaps behind a "+"
+    list,   ///< it is different words with commas between them, perhaps behind a "+"
     start,  ///< it starts with one of the words, and goes on without a blank
 };
 
@@ -23,6 +23,7 @@ struct Values {
     std::string type;  ///< as the help names it behind an option
     Form form;
     Words words = {};
+    Words alone = {};  ///< of a list: that are a value by themselves only
     /// Other words where the subcommand's first operand is this one.
     std::vector<std::pair<std::string, Words>> wordsBehind = {};
 };

@@ -25,7 +25,7 @@ Words columnKeys(const Kind& kind) {
 /// Kinds, columns of the kind that was given, and what a condition on such a column starts with.
 std::vector<completion::Values> inventoryValues() {
     completion::Values kinds{value_type::kind, Form::word};
-    completion::Values columns{value_type::columns, Form::list, {"all"}};
+    completion::Values columns{value_type::columns, Form::list, {}, {"all"}};
     completion::Values conditions{value_type::filter, Form::start};
     std::set<std::string> ofAnyKind;
     for (const Kind& kind : inventoryKinds()) {
@@ -34,7 +34,6 @@ std::vector<completion::Values> inventoryValues() {
         ofAnyKind.insert(keys.begin(), keys.end());
         kinds.words.push_back(key);
         conditions.wordsBehind.emplace_back(key, keys);
-        keys.insert(keys.begin(), "all");
         columns.wordsBehind.emplace_back(key, std::move(keys));
     }
     conditions.words.assign(ofAnyKind.begin(), ofAnyKind.end());

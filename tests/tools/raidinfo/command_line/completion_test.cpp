@@ -57,6 +57,20 @@ TEST(Completion, OffersTheColumnsOfTheKind) {
     EXPECT_THAT(offered("raidinfo list fans --columns vendor"), IsEmpty());
 }
 
+TEST(Completion, OffersAColumnOnceAndAllOnlyByItself) {
+    EXPECT_THAT(offered("raidinfo list fans -o a"), IsSupersetOf({"all", "adapter"}));
+    EXPECT_THAT(offered("raidinfo list -o ''"), Contains("all"));
+    const auto further = offered("raidinfo list fans -o status,index,''");
+    EXPECT_THAT(further, Contains("status,index,status_name"));
+    for (const char* const senseless :
+         {"status,index,all", "status,index,status", "status,index,index"}) {
+        EXPECT_THAT(further, Not(Contains(senseless)));
+    }
+    EXPECT_THAT(offered("raidinfo list fans -o +al"), IsEmpty());
+    EXPECT_THAT(offered("raidinfo list fans -o +index,ind"), IsEmpty());
+    EXPECT_THAT(offered("raidinfo list fans --columns = index,al"), IsEmpty());
+}
+
 TEST(Completion, OffersTheColumnsOfTheKindAsStartsOfAFilter) {
     EXPECT_THAT(offered("raidinfo list fans --filter ind"), ElementsAre("index"));
     EXPECT_THAT(offered("raidinfo list fans --filter vendor"), IsEmpty());
