@@ -96,6 +96,12 @@ TEST(ListCommand, HasNoErrorForAnEmptySystem) {
     }
 }
 
+TEST(ListCommand, HasNoTitlesInJsonToLeaveOut) {
+    const std::string answer = configuration(sampleAdapter());
+    EXPECT_EQ(dataOf(runWith(answer, {"list", "fans", "--noheadings", "--json"})),
+              dataOf(runWith(answer, {"list", "fans", "--json"})));
+}
+
 TEST(ListCommand, IsFinishedWhenTheAnswerComesAfterTheFirstProbe) {
     // The configuration fails, the service answers the probe, the second configuration is good.
     const ScriptedService service{{raid::test::Connection{},

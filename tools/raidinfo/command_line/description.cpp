@@ -13,7 +13,8 @@ constexpr int defaultLimitSeconds = 60;
 
 std::string footer() {
     std::string text =
-        "The options stand before or behind the subcommand.\n\nExit status:\n"
+        "The options stand before or behind the subcommand. Of several of one name the last one\n"
+        "counts, but filters add up.\n\nExit status:\n"
         "  0, 1, 2, 3  health: ok, warning, critical, unknown\n"
         "  0, 1, 2     diff: the same, different, trouble\n";
     for (const auto& [status, code, meaning] : statusWords) {

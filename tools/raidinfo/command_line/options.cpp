@@ -7,6 +7,21 @@
 #include "exit_status.h"
 
 namespace raidinfo {
+namespace {
+
+/// What is wrong with a command line without a subcommand, of which these words were not
+/// understood.
+std::string withoutSubcommand(const std::vector<std::string>& rest) {
+    if (rest.empty()) {
+        return "expected one of " + subcommandNames();
+    }
+    const std::string& word = rest.front();
+    return "\"" + word + "\" is no " +
+           (word.starts_with('-') ? "option, and a subcommand is missing"
+                                  : "subcommand; there are " + subcommandNames());
+}
+
+}  // namespace
 
 std::variant<Options, Information> parseOptions(int argc, const char* const* argv) {
     constexpr auto hint = " (see raidinfo --help)";
@@ -22,7 +37,8 @@ std::variant<Options, Information> parseOptions(int argc, const char* const* arg
         const bool lacksCommand = description.app().get_subcommands().empty();
         throw Failure{
             ExitStatus::usage,
-            (lacksCommand ? "expected one of " + subcommandNames() : error.what()) + hint};
+            (lacksCommand ? withoutSubcommand(description.app().remaining()) : error.what()) +
+                hint};
     } catch (const CLI::ParseError& error) {
         throw Failure{ExitStatus::usage, error.what() + std::string{hint}};
     }

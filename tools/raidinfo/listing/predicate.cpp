@@ -104,7 +104,8 @@ Predicate codePredicate(const Filter& filter, const CodeBook::Codes& codes) {
     const bool isOrdered =
         filter.comparison != Comparison::equal && filter.comparison != Comparison::notEqual;
     if (!isName || isOrdered) {
-        throw incomparable(filter, "which is a number or, for = and !=, one of " + namesOf(codes));
+        throw incomparable(filter, "which is a number or, for = and !=, one of " + namesOf(codes) +
+                                       ", or, for ~, a part of one");
     }
     return onEach<int>(filter, [=](int code) { return textHolds(nameOf(code), filter); });
 }

@@ -86,6 +86,12 @@ TEST(ListOptions, NameTheKindsThereAreWhenOneIsWrong) {
                 testing::AllOf(HasSubstr("\"disks\""), HasSubstr("disk_drives")));
 }
 
+TEST(ListOptions, MayStandTwice) {
+    EXPECT_THAT(command<ListOptions>({"list", "fans", "-o", "index", "-o", "status"}).columns->keys,
+                ElementsAre("status"));
+    EXPECT_FALSE(command<ListOptions>({"list", "--noheadings", "--noheadings"}).headings);
+}
+
 TEST(ShowOptions, NameAKindAndAPosition) {
     const auto show = command<ShowOptions>({"show", "disk_drives", "3"});
     EXPECT_EQ(show.kind, &kindOf(KindId::diskDrive));
@@ -123,6 +129,16 @@ TEST(RecordOptions, MayEndByThemselves) {
 TEST(DiffOptions, NameOneSnapshotOrTwo) {
     EXPECT_EQ(command<DiffOptions>({"diff", "a"}).after, "");
     EXPECT_EQ(command<DiffOptions>({"diff", "a", "b"}).after, "b");
+}
+
+TEST(Options, NameTheWordThatIsNoSubcommand) {
+    EXPECT_THAT(complaint({"frob"}), testing::StartsWith("\"frob\" is no subcommand; there are "
+                                                         "list, show, tree, "));
+    EXPECT_THAT(complaint({"--json", "frob"}), testing::StartsWith("\"frob\" is no subcommand"));
+    EXPECT_THAT(complaint({"frob", "list"}), HasSubstr("frob"));
+    EXPECT_THAT(complaint({"--frob"}), testing::StartsWith("\"--frob\" is no option, "));
+    EXPECT_THAT(complaint({"--frob", "list"}), HasSubstr("--frob"));
+    EXPECT_THAT(complaint({}), testing::StartsWith("expected one of list, show, tree, "));
 }
 
 TEST(Options, ThatAreWrongAreAUsageFailure) {
