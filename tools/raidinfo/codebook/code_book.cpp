@@ -10,9 +10,6 @@
 namespace raidinfo {
 namespace {
 
-constexpr auto adapterKinds =
-    std::to_array({KindId::pellionAdapter, KindId::lsiAdapter, KindId::vantryAdapter});
-
 std::string entryKey(std::string_view kind, std::string_view field) {
     std::string key{writtenKind(kind)};
     key += '.';
@@ -99,7 +96,9 @@ std::string shown(const Value& value, const CodeBook::Meaning* meaning) {
     }
     const auto& codes = std::get<CodeBook::Codes>(*meaning);
     const auto found = codes.find(*number);
-    return text + " (" + (found == codes.end() ? "unknown" : printable(found->second)) + ")";
+    const std::string_view name =
+        found == codes.end() ? unknownWord : std::string_view{found->second};
+    return text + " (" + printable(name) + ")";
 }
 
 }  // namespace raidinfo

@@ -13,7 +13,7 @@
 namespace raidinfo {
 
 /// The kind that stands for the adapters of every family in the files that people write.
-constexpr std::string_view anyAdapter = "adapters";
+constexpr std::string_view anyAdapter = adaptersKey;
 
 /// The kind under which those files speak of the records of a kind, the latter by its key.
 [[nodiscard]] std::string_view writtenKind(std::string_view kind) noexcept;

@@ -51,8 +51,9 @@ int codeIn(const Entry& entry) {
 
 const std::string& nameIn(const Entry& entry) {
     const std::string& name = textOf(entry.setting);
-    if (name.empty() || name == "unknown") {
-        refuse(entry.setting.place, "a name is neither empty nor \"unknown\"");
+    if (name.empty() || name == unknownWord) {
+        refuse(entry.setting.place,
+               "a name is neither empty nor \"" + std::string{unknownWord} + "\"");
     }
     return name;
 }

@@ -3,6 +3,9 @@
 #include <algorithm>
 #include <array>
 
+#include "inventory/overall_status.h"
+#include "inventory/value.h"
+
 namespace raidinfo::diff {
 namespace {
 
@@ -10,8 +13,14 @@ namespace {
 // stands nowhere here is neither better nor worse than another.
 
 // "unknown" is a status that the library has no word for.
-constexpr std::array overallStates{Grade{"Normal", 0}, Grade{"Warning", 1}, Grade{"Critical", 2},
-                                   Grade{"unknown", 1}};
+constexpr auto overallStates = [] {
+    std::array<Grade, overallStatusWords.size() + 1> grades{};
+    for (std::size_t index = 0; index < overallStatusWords.size(); ++index) {
+        grades[index] = {overallStatusWords[index], static_cast<int>(index)};
+    }
+    grades.back() = {unknownWord, 1};
+    return grades;
+}();
 constexpr std::array states{
     Grade{"normal", 0},  Grade{"ready", 0},    Grade{"online", 0},   Grade{"hot spare", 0},
     Grade{"present", 0}, Grade{"warning", 1},  Grade{"degraded", 1}, Grade{"rebuilding", 1},

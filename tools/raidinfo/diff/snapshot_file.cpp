@@ -6,6 +6,8 @@
 #include <utility>
 
 #include "diff/entries.h"
+#include "inventory/tree.h"
+#include "schema_version.h"
 #include "text/printable.h"
 
 namespace raidinfo::diff {
@@ -31,18 +33,14 @@ Json parsed(std::string_view text) {
     }
 }
 
-/// The first number of 1, "1" or "1.2".
-std::string majorVersion(const Json& version) {
-    const std::string text = version.is_string() ? version.get<std::string>() : version.dump();
-    return text.substr(0, text.find('.'));
-}
-
+/// Of 1, "1" or "1.2" the first number counts.
 void requireVersion(const Json& version) {
-    const std::string major = majorVersion(version);
-    const std::string expected = std::to_string(schemaMajorVersion);
+    const std::string text = version.is_string() ? version.get<std::string>() : version.dump();
+    const std::string_view major = majorVersion(text);
+    constexpr std::string_view expected = majorVersion(schemaVersion);
     if (major != expected) {
         throw SnapshotError{"a snapshot of schema version " + printable(major) +
-                            ", where only version " + expected + " is understood"};
+                            ", where only version " + std::string{expected} + " is understood"};
     }
 }
 
@@ -70,8 +68,8 @@ void requireComplete(const Json& file) {
 void requirePhysical(const Json& data) {
     const Json none = Json::array();
     const bool isLogical = std::ranges::any_of(
-        data.is_object() ? data.value("adapters", none) : none,
-        [](const Json& adapter) { return adapter.is_object() && adapter.contains("hot_spares"); });
+        data.is_object() ? data.value(std::string{adaptersKey}, none) : none,
+        [](const Json& adapter) { return adapter.is_object() && adapter.contains(hotSparesKey); });
     if (isLogical) {
         throw SnapshotError{"not a snapshot: it is the logical view of one"};
     }

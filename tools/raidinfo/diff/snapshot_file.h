@@ -6,9 +6,6 @@
 
 namespace raidinfo::diff {
 
-/// The major version of the snapshots that this program writes and understands.
-inline constexpr int schemaMajorVersion = 1;
-
 /// Says in one printable line why a text cannot be compared.
 class SnapshotError : public std::runtime_error {
 public:

@@ -53,8 +53,7 @@ constexpr Subject stepping(std::string_view step, Subject subject) {
 }
 
 constexpr std::array allSubjects{
-    usual(adapter, "adapter", "adapter", "adapter_id", std::nullopt,
-          kinds<KindId::pellionAdapter, KindId::lsiAdapter, KindId::vantryAdapter>,
+    usual(adapter, "adapter", "adapter", "adapter_id", std::nullopt, adapterKinds,
           lists<channel, array, spannedArray, logicalDrive>, renumbered),
     usual(channel, "channel", "channel", "channel_id", adapter, kinds<KindId::channel>,
           lists<diskDrive, enclosure>),
@@ -89,7 +88,7 @@ const Subject& subjectOf(SubjectId id) noexcept {
 }
 
 std::string_view listKey(const Subject& subject) noexcept {
-    return subject.id == adapter ? "adapters" : kindOf(subject.kinds.front()).key;
+    return subject.id == adapter ? adaptersKey : kindOf(subject.kinds.front()).key;
 }
 
 std::string_view memberListKey() noexcept { return listKey(subjectOf(diskDrive)); }

@@ -1,6 +1,6 @@
 #include "health/health_json.h"
 
-#include "overloaded.h"
+#include "inventory/value_json.h"
 
 namespace raidinfo::health {
 namespace {
@@ -11,15 +11,9 @@ OrderedJson orNull(const auto& optional) {
     return optional ? OrderedJson(*optional) : OrderedJson(nullptr);
 }
 
-OrderedJson jsonOf(const Value& value) {
-    return std::visit(Overloaded{[](Unknown) { return OrderedJson(nullptr); },
-                                 [](const auto& known) { return OrderedJson(known); }},
-                      value);
-}
-
 OrderedJson jsonOf(const Fact& fact) {
     return {
-        {"field", fact.field}, {"value", jsonOf(fact.value)}, {"code_name", orNull(fact.codeName)}};
+        {"field", fact.field}, {"value", toJson(fact.value)}, {"code_name", orNull(fact.codeName)}};
 }
 
 OrderedJson jsonOf(const Finding& finding);

@@ -285,6 +285,11 @@ std::span<const Kind> inventoryKinds() noexcept {
 
 const Kind& eventKind() noexcept { return allKinds.back(); }
 
+std::string_view familyName(KindId adapter) noexcept {
+    return adapterFamilies[static_cast<std::size_t>(std::ranges::find(adapterKinds, adapter) -
+                                                    adapterKinds.begin())];
+}
+
 const Kind& kindOf(KindId id) noexcept { return allKinds[static_cast<std::size_t>(id)]; }
 
 const Kind* findInventoryKind(std::string_view key) noexcept {

@@ -62,6 +62,16 @@ enum class KindId : std::uint8_t {
     event,
 };
 
+/// The key of a list with the adapters of every family, such as the trees begin with.
+inline constexpr std::string_view adaptersKey = "adapters";
+
+/// The kinds of the adapters' records, and their families in the same order.
+inline constexpr auto adapterKinds =
+    std::to_array({KindId::pellionAdapter, KindId::lsiAdapter, KindId::vantryAdapter});
+inline constexpr auto adapterFamilies =
+    std::to_array<std::string_view>({"pellion", "lsi", "vantry"});
+static_assert(adapterFamilies.size() == adapterKinds.size());
+
 /// One kind of record: how many there are, what they are called, which fields they have.
 struct Kind {
     KindId id;
@@ -79,6 +89,9 @@ struct Kind {
 
 /// The kind of the event records.
 [[nodiscard]] const Kind& eventKind() noexcept;
+
+/// The family of the adapters of one of their kinds.
+[[nodiscard]] std::string_view familyName(KindId adapter) noexcept;
 
 [[nodiscard]] const Kind& kindOf(KindId id) noexcept;
 

@@ -47,7 +47,7 @@ Group completed(const Group& group, const Drives& drives) {
 
 /// The drives that stand by for the arrays.
 Group hotSpares(const Drives& drives) {
-    Group spares{"hot_spares", {}};
+    Group spares{hotSparesKey, {}};
     for (const auto& [position, drive] : drives) {
         if (std::ranges::find(drive->extras, Extras::value_type{"hot_spare", true}) !=
             drive->extras.end()) {

@@ -16,17 +16,17 @@ namespace {
 
 using DriveAddress = std::pair<int, int>;  ///< channel, device
 
+/// Whose records the library publishes among those of which family.
 struct Family {
     std::string_view adapterType;
     KindId kind;
-    std::string_view name;
 };
 
 constexpr auto families = std::to_array<Family>({
-    {"o:PellionAdapter", KindId::pellionAdapter, "pellion"},
-    {"o:MirrelAdapter", KindId::pellionAdapter, "pellion"},
-    {"o:DorvelAdapter", KindId::vantryAdapter, "vantry"},
-    {"o:LSIAdapter", KindId::lsiAdapter, "lsi"},
+    {"o:PellionAdapter", KindId::pellionAdapter},
+    {"o:MirrelAdapter", KindId::pellionAdapter},
+    {"o:DorvelAdapter", KindId::vantryAdapter},
+    {"o:LSIAdapter", KindId::lsiAdapter},
 });
 
 std::string numbered(KindId id, int number) {
@@ -96,7 +96,7 @@ private:
                     .remark = "unknown type \"" + printable(decoded(type)) + "\""};
         }
         Node node = publication.next(family->kind, id);
-        node.extras = {{"family", std::string{family->name}}, {"adapter_type", type}};
+        node.extras = {{"family", std::string{familyName(family->kind)}}, {"adapter_type", type}};
         return node;
     }
 
@@ -248,7 +248,7 @@ private:
 
 Group adapterTrees(const std::vector<RAIDAdapter>& adapters, const Snapshot& snapshot) {
     Publication publication{snapshot};
-    Group trees{"adapters", {}};
+    Group trees{adaptersKey, {}};
     for (const RAIDAdapter& adapter : adapters) {
         trees.nodes.push_back(AdapterWalk{publication, adapter}.node());
     }

@@ -2,6 +2,7 @@
 
 #include <cstddef>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -11,6 +12,9 @@
 #include "inventory/records.h"
 
 namespace raidinfo {
+
+/// The list that only the logical view has.
+inline constexpr std::string_view hotSparesKey = "hot_spares";
 
 struct Node;
 
@@ -35,5 +39,13 @@ struct Node {
     bool inFull = true;  ///< false for a record that stands in full elsewhere in the tree
     std::vector<Group> groups = {};
 };
+
+/// Null where there is nothing under this key.
+[[nodiscard]] const Value* findExtra(const Extras& extras, std::string_view key);
+
+/// The value of a field of the tree. The holders are what the node belongs to, from the adapter
+/// down.
+[[nodiscard]] Value valueOf(const TreeField& field, const Node& node,
+                            std::span<const Node* const> holders);
 
 }  // namespace raidinfo

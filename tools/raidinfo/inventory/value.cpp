@@ -21,7 +21,7 @@ std::string shown(const Value& value) {
         Overloaded{[](int number) { return std::to_string(number); },
                    [](bool flag) { return std::string{flag ? "yes" : "no"}; },
                    [](const std::string& text) { return text.empty() ? "-" : printable(text); },
-                   [](Unknown) { return std::string{"unknown"}; },
+                   [](Unknown) { return std::string{unknownWord}; },
                    [](const std::vector<int>& numbers) {
                        return numbers.empty() ? "-" : joined(numbers);
                    }},

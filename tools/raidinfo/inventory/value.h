@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 #include <variant>
 #include <vector>
 
@@ -10,6 +11,9 @@ namespace raidinfo {
 struct Unknown {
     bool operator==(const Unknown&) const = default;
 };
+
+/// What people read and write for it, and for a code without a name.
+inline constexpr std::string_view unknownWord = "unknown";
 
 /// A field as it was read, texts decoded.
 using Value = std::variant<int, bool, std::string, Unknown, std::vector<int>>;

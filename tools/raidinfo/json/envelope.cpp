@@ -4,13 +4,11 @@
 #include <nlohmann/json.hpp>
 #include <utility>
 
+#include "schema_version.h"
 #include "system/timestamp.h"
 
 namespace raidinfo {
 namespace {
-
-/// A member that is renamed or removed, or changes its meaning, makes it a new number.
-constexpr auto schemaVersion = "1.0";
 
 constexpr int indentation = 2;
 

@@ -11,7 +11,7 @@ namespace raidinfo {
 
 /// What a document tells about.
 struct Source {
-    std::string_view type;  ///< "service", "recording", "none"
+    std::string_view type;  ///< "service", "recording", "files" (of a diff), "none"
     std::string name;       ///< the service's address, a file
 };
 

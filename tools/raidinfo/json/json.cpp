@@ -3,8 +3,6 @@
 #include <nlohmann/json.hpp>
 #include <string>
 
-#include "overloaded.h"
-
 namespace raidinfo {
 namespace {
 
@@ -42,12 +40,6 @@ Json toJson(const Group& group) {
 }
 
 }  // namespace
-
-Json toJson(const Value& value) {
-    return std::visit(Overloaded{[](Unknown) { return Json(nullptr); },
-                                 [](const auto& known) { return Json(known); }},
-                      value);
-}
 
 Json rowsJson(const Listing& listing) {
     auto list = Json::array();

@@ -5,13 +5,12 @@
 #include "inventory/kinds.h"
 #include "inventory/records.h"
 #include "inventory/tree.h"
+#include "inventory/value_json.h"
 #include "listing/listing.h"
 
 namespace raidinfo {
 
 using Json = nlohmann::ordered_json;
-
-[[nodiscard]] Json toJson(const Value& value);
 
 /// The rows of a listing: a list of objects with a member for each column.
 [[nodiscard]] Json rowsJson(const Listing& listing);

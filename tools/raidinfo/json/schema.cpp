@@ -6,8 +6,11 @@
 #include <utility>
 #include <vector>
 
+#include "health/severity.h"
 #include "inventory/kinds.h"
-#include "listing/listing.h"
+#include "inventory/overall_status.h"
+#include "inventory/tree.h"
+#include "schema_version.h"
 
 namespace raidinfo {
 namespace {
@@ -48,8 +51,11 @@ Json typeOf(Shape shape) {
             return type("boolean");
         case Shape::numbers:
             return listOf(type("integer"));
-        case Shape::statusText:
-            return Json::object({{"enum", {"Normal", "Warning", "Critical", nullptr}}});
+        case Shape::statusText: {
+            Json words = overallStatusWords;
+            words.push_back(nullptr);
+            return Json::object({{"enum", std::move(words)}});
+        }
         case Shape::text:
         case Shape::displayName:
             break;
@@ -96,7 +102,7 @@ Json nodeSchema() {
     for (const Kind& kind : inventoryKinds()) {
         lists[std::string{kind.key}] = listOf(reference("node"));
     }
-    lists["hot_spares"] = listOf(reference("node"));
+    lists[std::string{hotSparesKey}] = listOf(reference("node"));
     lists["position"] = type("integer");
     return Json::object({{"type", "object"}, {"properties", std::move(lists)}});
 }
@@ -117,7 +123,7 @@ Json oneOf(std::initializer_list<const char*> words) {
     return Json::object({{"enum", std::move(list)}});
 }
 
-Json severitySchema() { return oneOf({"ok", "warning", "critical", "unknown"}); }
+Json severitySchema() { return Json::object({{"enum", health::severityWords}}); }
 
 std::vector<std::pair<std::string, Json>> factMembers() {
     return {{"field", type("string")},
@@ -180,7 +186,7 @@ Json definitions() {
     definitions["node"] = nodeSchema();
     definitions["list"] = listsSchema();
     definitions["show"] = showSchema();
-    definitions["tree"] = object({{"adapters", listOf(reference("node"))}});
+    definitions["tree"] = object({{std::string{adaptersKey}, listOf(reference("node"))}});
     definitions["event"] = eventSchema();
     definitions["snapshot"] = object({{"file", type("string")}});
     definitions["record"] = object({{"file", type("string")}, {"answers", type("integer")}});
@@ -207,7 +213,7 @@ Json schema() {
         object({{"type", Json::object({{"enum", {"service", "recording", "files", "none"}}})},
                 {"name", type("string")}});
     Json document =
-        object({{"schema_version", Json::object({{"const", "1.0"}})},
+        object({{"schema_version", Json::object({{"const", schemaVersion}})},
                 {"generated_at", Json::object({{"type", "string"}, {"format", "date-time"}})},
                 {"source", source},
                 {"complete", type("boolean")},

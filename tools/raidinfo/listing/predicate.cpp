@@ -12,14 +12,13 @@
 #include <vector>
 
 #include "exit_status.h"
+#include "inventory/overall_status.h"
 #include "text/enumerated.h"
 
 namespace raidinfo {
 namespace {
 
 using Comparison = Filter::Comparison;
-
-constexpr std::string_view unknown = "unknown";
 
 template <typename T>
 bool holds(const T& value, Comparison comparison, const T& wanted) {
@@ -80,7 +79,7 @@ std::int64_t wantedNumber(const Filter& filter) {
 
 /// The names of codes, each once, and what a code without a name is called.
 std::string namesOf(const CodeBook::Codes& codes) {
-    std::set<std::string_view> names{unknown};
+    std::set<std::string_view> names{unknownWord};
     for (const auto& [code, name] : codes) {
         names.insert(name);
     }
@@ -91,7 +90,7 @@ std::string namesOf(const CodeBook::Codes& codes) {
 Predicate codePredicate(const Filter& filter, const CodeBook::Codes& codes) {
     const auto nameOf = [&codes](int code) {
         const auto found = codes.find(code);
-        return found == codes.end() ? std::string{unknown} : found->second;
+        return found == codes.end() ? std::string{unknownWord} : found->second;
     };
     if (filter.comparison == Comparison::contains) {
         return onEach<int>(filter, [=](int code) {
@@ -99,7 +98,7 @@ Predicate codePredicate(const Filter& filter, const CodeBook::Codes& codes) {
         });
     }
     const bool isName =
-        filter.value == unknown ||
+        filter.value == unknownWord ||
         std::ranges::any_of(codes, [&](const auto& code) { return code.second == filter.value; });
     const bool isOrdered =
         filter.comparison != Comparison::equal && filter.comparison != Comparison::notEqual;
@@ -151,11 +150,10 @@ Predicate flagPredicate(const Filter& filter) {
 }
 
 Predicate statusPredicate(const Filter& filter) {
-    constexpr auto words =
-        std::to_array<std::string_view>({"Normal", "Warning", "Critical", unknown});
-    if (filter.comparison != Comparison::contains &&
-        std::ranges::find(words, filter.value) == words.end()) {
-        throw incomparable(filter, "which is Normal, Warning, Critical or unknown");
+    if (filter.comparison != Comparison::contains && filter.value != unknownWord &&
+        std::ranges::find(overallStatusWords, filter.value) == overallStatusWords.end()) {
+        throw incomparable(filter, "which is " + enumerated(overallStatusWords) + " or " +
+                                       std::string{unknownWord});
     }
     return shownPredicate(filter);
 }

@@ -1,8 +1,10 @@
 #include "presentation/table.h"
 
+#include <algorithm>
 #include <array>
-#include <utility>
 #include <vector>
+
+#include "inventory/overall_status.h"
 
 namespace raidinfo {
 namespace {
@@ -35,16 +37,15 @@ std::vector<GridColumn> gridOf(const Listing& listing, const CodeBook& book) {
 }  // namespace
 
 Style styleOf(const Value& value, const Field* field) {
-    constexpr auto words = std::to_array<std::pair<std::string_view, Style>>(
-        {{"Normal", Style::good}, {"Warning", Style::warning}, {"Critical", Style::critical}});
+    constexpr std::array styles{Style::good, Style::warning, Style::critical};
+    static_assert(styles.size() == overallStatusWords.size());
     if (field == nullptr || field->shape != Shape::statusText) {
         return Style::plain;
     }
     if (const auto* const text = std::get_if<std::string>(&value)) {
-        for (const auto& [word, style] : words) {
-            if (*text == word) {
-                return style;
-            }
+        const auto word = std::ranges::find(overallStatusWords, *text);
+        if (word != overallStatusWords.end()) {
+            return styles[static_cast<std::size_t>(word - overallStatusWords.begin())];
         }
     }
     return Style::unknown;
