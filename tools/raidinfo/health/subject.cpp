@@ -14,10 +14,8 @@ namespace raidinfo::health {
 namespace {
 
 const Value* valueIn(const Node& node, std::string_view field) {
-    for (const auto& [key, value] : node.extras) {
-        if (key == field) {
-            return &value;
-        }
+    if (const Value* const known = findExtra(node.extras, field)) {
+        return known;
     }
     if (node.record == nullptr) {
         return nullptr;
@@ -82,7 +80,11 @@ public:
 private:
     void visit(const Node& node, std::string_view kind, std::vector<std::size_t> above,
                const std::string& addressAbove) {
-        Subject subject{.kind = kind, .node = &node, .above = above, .address = addressAbove};
+        Subject subject{.kind = kind,
+                        .node = &node,
+                        .above = above,
+                        .places = placesOf(node, above),
+                        .address = addressAbove};
         subject.address += (addressAbove.empty() ? "" : ", ") + step(subject);
         if (node.kind != nullptr && node.kind->id == KindId::diskDrive && node.inFull &&
             node.position) {
@@ -96,6 +98,22 @@ private:
         }
     }
 
+    Extras placesOf(const Node& node, const std::vector<std::size_t>& above) const {
+        Extras places;
+        if (node.kind != nullptr) {
+            std::vector<const Node*> holders;
+            for (const std::size_t holder : above) {
+                holders.push_back(subjects[holder].node);
+            }
+            for (const TreeField& field : node.kind->fromTree) {
+                if (field.holder) {
+                    places.emplace_back(field.key, valueOf(field, node, holders));
+                }
+            }
+        }
+        return places;
+    }
+
     std::vector<Subject> subjects;
     std::set<std::pair<KindId, std::size_t>> seen;
     std::map<std::size_t, const Node*> drives;  ///< by position
@@ -104,8 +122,10 @@ private:
 }  // namespace
 
 const Value* Subject::find(std::string_view field) const {
-    const Value* const value = valueIn(*node, field);
-    return value == nullptr && drive != nullptr ? valueIn(*drive, field) : value;
+    if (const Value* const value = valueIn(*node, field)) {
+        return value;
+    }
+    return drive != nullptr ? valueIn(*drive, field) : findExtra(places, field);
 }
 
 std::vector<Subject> subjectsOf(const Group& adapters) {

@@ -16,6 +16,7 @@ struct Subject {
     const Node* node;                ///< its place in the tree
     const Node* drive = nullptr;     ///< the drive that a member of an array is
     std::vector<std::size_t> above;  ///< the subjects that it stands below, outermost first
+    Extras places;                   ///< the numbers of what it belongs to, as listings name them
     std::string address;             ///< "adapter 1, channel 1, disk drive 3, serial QS0103000K"
 
     /// The value of a field, also of one that only the tree knows; null where there is none.

@@ -1,33 +1,13 @@
 #include "health/vocabulary.h"
 
 #include <algorithm>
-#include <array>
 
 #include "codebook/code_book.h"
 #include "inventory/kinds.h"
+#include "inventory/overall_status.h"
 
 namespace raidinfo::health {
 namespace {
-
-constexpr auto statusWords = std::to_array<std::string_view>({"Normal", "Warning", "Critical"});
-constexpr auto families = std::to_array<std::string_view>({"pellion", "lsi", "vantry"});
-
-struct TreeField {
-    std::string_view kind;
-    RuleField field;
-};
-
-/// What the tree knows beside the published fields.
-constexpr auto treeFields = std::to_array<TreeField>({
-    {anyAdapter, {"family", FieldType::word, families}},
-    {anyAdapter, {"adapter_type", FieldType::text}},
-    {"disk_drives", {"device_id", FieldType::number}},
-    {"disk_drives", {"hot_spare", FieldType::flag}},
-    {"fans", {"index", FieldType::number}},
-    {"power_supplies", {"index", FieldType::number}},
-    {"temperature_sensors", {"index", FieldType::number}},
-    {arrayMembers, {"present", FieldType::flag}},
-});
 
 FieldType typeOf(Shape shape) {
     switch (shape) {
@@ -47,17 +27,25 @@ FieldType typeOf(Shape shape) {
     return FieldType::text;
 }
 
+RuleField fieldOf(std::string_view key, Shape shape) {
+    const FieldType type = typeOf(shape);
+    return type == FieldType::word ? RuleField{key, type, overallStatusWords}
+                                   : RuleField{key, type};
+}
+
 void add(std::vector<RuleField>& fields, const RuleField& field) {
     if (std::ranges::find(fields, field.key, &RuleField::key) == fields.end()) {
         fields.push_back(field);
     }
 }
 
-void addTreeFields(std::vector<RuleField>& fields, std::string_view kind) {
-    for (const TreeField& row : treeFields) {
-        if (row.kind == kind) {
-            add(fields, row.field);
-        }
+/// What the tree knows of a kind besides what listings show of it.
+void addOwn(std::vector<RuleField>& fields, std::string_view kind) {
+    if (kind == anyAdapter) {
+        add(fields, {"family", FieldType::word, adapterFamilies});
+    }
+    if (kind == arrayMembers) {
+        add(fields, {"present", FieldType::flag});
     }
 }
 
@@ -76,15 +64,13 @@ std::vector<std::string> ruleKinds() {
 
 std::vector<RuleField> ruleFields(std::string_view kind) {
     std::vector<RuleField> fields;
-    addTreeFields(fields, kind);
-    if (kindOfCodes(kind) != kind) {
-        addTreeFields(fields, kindOfCodes(kind));
-    }
-    for (const Kind* const published : kindsWritten(kindOfCodes(kind))) {
-        for (const Field& field : published->fields) {
-            const FieldType type = typeOf(field.shape);
-            add(fields, type == FieldType::word ? RuleField{field.key, type, statusWords}
-                                                : RuleField{field.key, type});
+    addOwn(fields, kind);
+    for (const Kind* const listed : kindsWritten(kindOfCodes(kind))) {
+        for (const TreeField& field : listed->fromTree) {
+            add(fields, fieldOf(field.key, field.shape));
+        }
+        for (const Field& field : listed->fields) {
+            add(fields, fieldOf(field.key, field.shape));
         }
     }
     return fields;

@@ -13,17 +13,6 @@ namespace {
 /// What the tree tells of a kind's records, by position.
 using ValuesByPosition = std::map<std::size_t, std::vector<Value>>;
 
-/// The holders are what the node belongs to, from the adapter down.
-Value valueOf(const TreeField& field, const Node& node, const std::vector<const Node*>& holders) {
-    if (field.holder) {
-        // Enclosures stand below channels, and those below adapters.
-        const auto depth = static_cast<std::size_t>(*field.holder);
-        return depth < holders.size() ? Value{holders[depth]->number} : Unknown{};
-    }
-    const auto found = std::ranges::find(node.extras, field.key, &Extras::value_type::first);
-    return found == node.extras.end() ? Unknown{} : found->second;
-}
-
 void gather(const Kind& kind, const Group& group, std::vector<const Node*>& holders,
             ValuesByPosition& found) {
     for (const Node& node : group.nodes) {

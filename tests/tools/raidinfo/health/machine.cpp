@@ -56,7 +56,9 @@ void Machine::add(KindId kind, const std::map<std::string_view, Value>& values) 
 }
 
 Node Machine::node(KindId kind, std::size_t position, const char* title, Extras extras) const {
-    return {.title = title,
+    const std::string words = title;
+    return {.title = words,
+            .number = std::stoi(words.substr(words.rfind(' '))),
             .extras = std::move(extras),
             .kind = &kindOf(kind),
             .record = &snapshot.of(kind).at(position),

@@ -85,8 +85,9 @@ INSTANTIATE_TEST_SUITE_P(
                     "site.toml:3: the kind stands there twice"},
         WrongPolicy{"field",
                     "[[rule]]\nname = \"fan-critical\"\nwhen = { field = \"speed\", is = 1 }",
-                    "site.toml:3: unknown field of fans \"speed\"; known: index, fan_name, "
-                    "status_name, channel_name, adapter_name, status, enclosure_id, channel_id, "
+                    "site.toml:3: unknown field of fans \"speed\"; known: index, enclosure, "
+                    "channel, adapter, fan_name, status_name, channel_name, adapter_name, status, "
+                    "enclosure_id, channel_id, "
                     "adapter_id"},
         WrongPolicy{"field_of_one_of_the_kinds",
                     "[[rule]]\nname = \"fan-critical\"\nkind = [\"fans\", \"channels\"]",

@@ -6,6 +6,8 @@
 #include <algorithm>
 
 #include "health/judge.h"
+#include "health/vocabulary.h"
+#include "listing/listing.h"
 #include "machine.h"
 #include "settings/document.h"
 #include "support/files.h"
@@ -95,6 +97,34 @@ TEST(Policy, ChangesACountAndSoTheRulesThatUseIt) {
         machine.set(KindId::diskDrive, drive, "state", 0);
     }
     EXPECT_THAT(found(machine, wider), ElementsAre("warning hot-spare-missing"));
+}
+
+TEST(Policy, NamesWhatAListingShows) {
+    for (const std::string& kind : ruleKinds()) {
+        const auto fields = ruleFields(kind);
+        for (const Kind* const listed : kindsWritten(kindOfCodes(kind))) {
+            for (const ListColumn& column : columnsOf(*listed)) {
+                if (column.key != "position") {
+                    EXPECT_NE(std::ranges::find(fields, column.key, &RuleField::key), fields.end())
+                        << kind << " " << column.key;
+                }
+            }
+        }
+    }
+}
+
+TEST(Policy, MayKeepToTheFansOfAnEnclosure) {
+    Machine machine;
+    const auto finds = [&machine](const std::string& place) {
+        return found(machine,
+                     ruleOn("fans", "[" + place + ", { field = \"index\", at_least = 0 }]"));
+    };
+    EXPECT_THAT(finds("{ field = \"enclosure\", is = 8 }"), ElementsAre("warning mine"));
+    EXPECT_THAT(finds("{ field = \"enclosure\", is = 7 }"), IsEmpty());
+    EXPECT_THAT(finds("{ field = \"channel\", is = 1 }"), ElementsAre("warning mine"));
+    EXPECT_THAT(finds("{ field = \"channel\", is = 0 }"), IsEmpty());
+    EXPECT_THAT(finds("{ field = \"adapter\", is = 1 }"), ElementsAre("warning mine"));
+    EXPECT_THAT(finds("{ field = \"adapter\", is = 8 }"), IsEmpty());
 }
 
 TEST(Policy, IsReadFromAFile) {
