@@ -9,8 +9,10 @@ namespace raidinfo {
 /// The library asks for the events of so many numbers at once.
 constexpr int numbersAsked = 101;
 
-/// The loaded libRAIDInstrumentation, unloaded with its last copy. Everything the program knows of
-/// the library goes through the exported names looked up here.
+/// The loaded libRAIDInstrumentation, unloaded with its last copy. The program calls it only
+/// through the exported names looked up here; of the library's sources it has compiled in the
+/// classes of the model, whose getters are inline, and what recordings need to ask and to read as
+/// the library does.
 class Library {
 public:
     /// Loads `path`; without one the library beside this program, else the installed one.
