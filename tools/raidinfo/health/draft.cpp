@@ -18,7 +18,7 @@ Draft draftIn(const settings::Setting& setting, const std::string& what) {
     if (text.empty() || text.find_first_not_of(nameCharacters) != std::string::npos) {
         refuse(name.place, "a name consists of letters, digits, hyphens and underscores");
     }
-    return {text, name.place, table};
+    return {.name = text, .place = name.place, .table = table};
 }
 
 std::vector<Draft> draftsIn(const settings::Setting* list, const std::string& what) {
@@ -54,6 +54,7 @@ void standAt(settings::Setting& setting, const settings::Place& at) {
 /// where the change does.
 void amend(Draft& draft, const Draft& change) {
     draft.place = change.place;
+    draft.isChange = true;
     for (settings::Entry& entry : draft.table) {
         standAt(entry.setting, draft.place);
     }
@@ -72,6 +73,7 @@ void amend(std::vector<Draft>& drafts, const std::vector<Draft>& changes) {
         const auto changed = std::ranges::find(drafts, change.name, &Draft::name);
         if (changed == drafts.end()) {
             drafts.push_back(change);
+            drafts.back().isChange = true;
         } else {
             amend(*changed, change);
         }

@@ -12,6 +12,7 @@ struct Draft {
     std::string name;
     settings::Place place;
     settings::Table table;
+    bool isChange = false;  ///< wholly or partly of a file that amends the default policy
 };
 
 /// A policy file, not yet understood.

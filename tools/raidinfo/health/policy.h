@@ -18,6 +18,8 @@ struct Count {
     enum class Within : std::uint8_t { adapter, array };
 
     std::string name;
+    settings::Place place = {};
+    bool isChange = false;        ///< wholly or partly of a file that amends the default policy
     std::vector<std::string> on;  ///< the kinds that have it
     std::string of;               ///< the kind that is counted
     Within within = Within::adapter;

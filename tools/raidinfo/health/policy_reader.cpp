@@ -60,6 +60,8 @@ Severity severityIn(const Setting& setting) {
 Count readCount(const Draft& draft, const CodeBook& book) {
     settings::TableReader reader{draft.table, draft.place, "count \"" + draft.name + "\""};
     Count count{.name = textOf(reader.need("name")),
+                .place = draft.place,
+                .isChange = draft.isChange,
                 .on = kindsIn(reader.need("on")),
                 .of = kindIn(reader.need("of")),
                 .within = static_cast<Count::Within>(
@@ -106,6 +108,33 @@ void checkPlaceholders(const Message& message, const Setting& setting, const std
     }
 }
 
+bool speaksOf(const Setting& condition, const std::string& field) {
+    const Setting* const named =
+        settings::TableReader{tableOf(condition), condition.place, "condition"}.find("field");
+    return named != nullptr && textOf(*named) == field;
+}
+
+bool speakOf(const Setting& when, const std::string& field) {
+    return std::holds_alternative<settings::List>(when.value)
+               ? std::ranges::any_of(
+                     listOf(when),
+                     [&field](const Setting& condition) { return speaksOf(condition, field); })
+               : speaksOf(when, field);
+}
+
+/// Where a default rule lacks a count because that was changed, the change is wrong, not the rule.
+void refuseLoss(const Draft& rule, const Setting& when, const std::string& kind,
+                const std::vector<Count>& counts) {
+    for (const Count& count : counts) {
+        const bool isLost =
+            count.isChange && !rule.isChange && std::ranges::find(count.on, kind) == count.on.end();
+        if (isLost && speakOf(when, count.name)) {
+            refuse(count.place, "rule \"" + rule.name + "\" needs the count on " + kind + " (" +
+                                    settings::shown(rule.place) + ")");
+        }
+    }
+}
+
 Rule readRule(const Draft& draft, const std::vector<Count>& counts, const CodeBook& book) {
     settings::TableReader reader{draft.table, draft.place, "rule \"" + draft.name + "\""};
     const Setting& message = reader.need("message");
@@ -125,6 +154,7 @@ Rule readRule(const Draft& draft, const std::vector<Count>& counts, const CodeBo
         return rule;  // it may speak of what this code book does not have
     }
     for (std::string& kind : kindsIn(kinds)) {
+        refuseLoss(draft, when, kind, counts);
         const auto fields = fieldsWithCounts(kind, counts);
         checkPlaceholders(rule.message, message, kind, fields);
         auto conditions = readConditions(when, kind, fields, book);

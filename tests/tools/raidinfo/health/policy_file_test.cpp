@@ -219,6 +219,21 @@ INSTANTIATE_TEST_SUITE_P(
                     "[[rule]]\nname = \"hot-spare-missing\"\n"
                     "when = { field = \"ready_spares\", in = [0, -1] }",
                     "site.toml:3: adapters.ready_spares is a count, and never below 0"},
+        WrongPolicy{"count_taken_from_a_default_rule",
+                    "[[count]]\nname = \"ready_spares\"\non = \"adapters\"",
+                    "site.toml:2: rule \"logical-drive-degraded\" needs the count on "
+                    "logical_drives (health.toml:"},
+        WrongPolicy{"count_taken_from_a_new_rule",
+                    "[[count]]\nname = \"write_back_logical_drives\"\non = \"channels\"\n"
+                    "[[rule]]\nname = \"write-cache-unprotected\"\nenabled = false\n" +
+                        wrongRule("severity = \"warning\"\nmessage = \"m\"\nkind = \"adapters\"\n"
+                                  "when = { field = \"write_back_logical_drives\", is = 1 }"),
+                    "site.toml:12: unknown field of adapters \"write_back_logical_drives\""},
+        WrongPolicy{"count_taken_from_a_rule_beside_it",
+                    "[[count]]\nname = \"ready_spares\"\non = \"adapters\"\n"
+                    "[[rule]]\nname = \"logical-drive-degraded\"\n"
+                    "when = { field = \"ready_spares\", is = 1 }",
+                    "site.toml:6: unknown field of logical_drives \"ready_spares\""},
         WrongPolicy{"count_on_another_kind",
                     "[[rule]]\nname = \"fan-critical\"\n"
                     "when = { field = \"ready_spares\", is = 1 }",
