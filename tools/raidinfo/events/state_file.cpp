@@ -54,9 +54,6 @@ void StateFile::write(const LastShown& last) const {
     replaceFile(path, line + "\n");
 }
 
-void StateFile::tryToWrite() const {
-    write({0});
-    std::filesystem::remove(path);
-}
+void StateFile::tryToWrite() const { checkReplaceable(path); }
 
 }  // namespace raidinfo

@@ -17,9 +17,10 @@ public:
     [[nodiscard]] std::optional<LastShown> read() const;
 
     /// Replaces the file in one step, so that whatever happens it holds the old event or the new.
+    /// A link stays, and what it leads to is replaced.
     void write(const LastShown& last) const;
 
-    /// Fails as write does, and leaves no file.
+    /// Fails as write does, and changes nothing.
     void tryToWrite() const;
 
 private:

@@ -146,6 +146,13 @@ void replaceFile(const std::filesystem::path& path, std::string_view content) {
     }
 }
 
+void checkReplaceable(const std::filesystem::path& path) {
+    const auto before = statusOf(path);
+    if (!before || S_ISREG(before->st_mode)) {
+        const NewFile beside{withoutLinks(path), before};
+    }
+}
+
 GrowingFile::GrowingFile(std::filesystem::path path)
     : name{std::move(path)}, file{created(name), "cannot write a file"} {}
 

@@ -20,6 +20,9 @@ constexpr std::size_t longestFile = std::size_t{256} * 1024 * 1024;
 /// pipe, is written to. What cannot be written is a cannotCreate Failure.
 void replaceFile(const std::filesystem::path& path, std::string_view content);
 
+/// Fails as replaceFile does where no file can be made beside the one to replace; changes nothing.
+void checkReplaceable(const std::filesystem::path& path);
+
 /// A new file that is good after every piece that is appended. What cannot be written is a
 /// cannotCreate Failure.
 class GrowingFile {

@@ -5,13 +5,27 @@
 
 #include <filesystem>
 #include <fstream>
+#include <set>
+#include <string>
 
 #include "exit_status.h"
+#include "support/files.h"
 
 namespace raidinfo {
 namespace {
 
+namespace fs = std::filesystem;
+using testing::ElementsAre;
 using testing::HasSubstr;
+using testing::IsEmpty;
+
+std::set<std::string> filesHere() {
+    std::set<std::string> names;
+    for (const fs::directory_entry& entry : fs::directory_iterator{"."}) {
+        names.insert(entry.path().filename());
+    }
+    return names;
+}
 
 void expectBadInput(const std::string& content) {
     std::ofstream{"state"} << content;
@@ -22,7 +36,7 @@ void expectBadInput(const std::string& content) {
         EXPECT_EQ(failure.status(), ExitStatus::badInput);
         EXPECT_THAT(failure.what(), HasSubstr("state"));
     }
-    std::filesystem::remove("state");
+    fs::remove("state");
 }
 
 TEST(StateFile, IsEmptyBeforeItIsWritten) { EXPECT_EQ(StateFile{"state"}.read(), std::nullopt); }
@@ -33,8 +47,7 @@ TEST(StateFile, KeepsTheNumberAndTheContent) {
     EXPECT_EQ(StateFile{"state"}.read(), LastShown{41});
     state.write({2147483647, 0xFEDCBA9876543210U});
     EXPECT_EQ(StateFile{"state"}.read(), (LastShown{2147483647, 0xFEDCBA9876543210U}));
-    EXPECT_FALSE(std::filesystem::exists("state.new"));
-    std::filesystem::remove("state");
+    EXPECT_THAT(filesHere(), ElementsAre("state"));
 }
 
 TEST(StateFile, IsNotTakenForANumberWhenItHoldsSomethingElse) {
@@ -46,8 +59,26 @@ TEST(StateFile, IsNotTakenForANumberWhenItHoldsSomethingElse) {
 
 TEST(StateFile, IsTriedWithoutATrace) {
     StateFile{"state"}.tryToWrite();
-    EXPECT_FALSE(std::filesystem::exists("state"));
+    EXPECT_THAT(filesHere(), IsEmpty());
     EXPECT_THROW(StateFile{"nowhere/state"}.tryToWrite(), Failure);
+}
+
+TEST(StateFile, IsTriedWhereALinkLeadsToAndTheLinkStays) {
+    fs::create_symlink("target", "state");
+    StateFile{"state"}.tryToWrite();
+    EXPECT_THAT(filesHere(), ElementsAre("state"));
+    EXPECT_EQ(fs::read_symlink("state"), "target");
+    fs::create_symlink("nowhere/target", "astray");
+    EXPECT_THROW(StateFile{"astray"}.tryToWrite(), Failure);
+    EXPECT_TRUE(fs::is_symlink("astray"));
+}
+
+TEST(StateFile, IsWrittenWhereALinkLeadsToAndTheLinkStays) {
+    raid::test::writeFile("target", "1\n");
+    fs::create_symlink("target", "state");
+    StateFile{"state"}.write({2});
+    EXPECT_EQ(fs::read_symlink("state"), "target");
+    EXPECT_EQ(raid::test::readFile("target"), "2\n");
 }
 
 TEST(StateFile, SaysThatItCannotBeWritten) {

@@ -86,12 +86,25 @@ TEST_F(ReplacedFile, CannotBeALinkToItself) {
 }
 
 TEST_F(ReplacedFile, LeavesFilesWithLikeNamesAlone) {
+    // Of an earlier process with the same number, as it were.
+    const fs::path left = folder / ("file." + std::to_string(getpid()) + "-0.new");
     writeFile(other, "other");
-    fs::create_symlink("other", folder / "file.new");
+    fs::create_symlink("other", left);
     replaceFile(file, "content");
     EXPECT_EQ(readFile(other), "other");
-    EXPECT_TRUE(fs::is_symlink(folder / "file.new"));
+    EXPECT_TRUE(fs::is_symlink(left));
     EXPECT_TRUE(fs::is_regular_file(fs::symlink_status(file)));
+    EXPECT_EQ(filesInFolder(), 3);
+}
+
+TEST_F(ReplacedFile, IsTriedWithoutATrace) {
+    checkReplaceable(file);
+    EXPECT_EQ(filesInFolder(), 0);
+    writeFile(file, "content");
+    checkReplaceable(file);
+    EXPECT_EQ(readFile(file), "content");
+    EXPECT_EQ(filesInFolder(), 1);
+    EXPECT_THROW(checkReplaceable(folder / "nowhere/file"), Failure);
 }
 
 TEST_F(ReplacedFile, StaysThePipeThatItIs) {
