@@ -3,37 +3,23 @@
 #include <toml++/toml.h>
 
 #include <algorithm>
-#include <cerrno>
-#include <fstream>
 #include <system_error>
 #include <utility>
 
 #include "exit_status.h"
-#include "text/printable.h"
+#include "system/file.h"
 
 namespace raidinfo::settings {
 namespace {
-
-[[noreturn]] void cannotRead(const std::filesystem::path& path, const std::string& reason) {
-    throw Failure{ExitStatus::noInput, "cannot read " + printable(path.string()) + ": " + reason};
-}
 
 std::string textOfFile(const std::filesystem::path& path) {
     std::error_code error;
     // Anything else may never end.
     if (!std::filesystem::is_regular_file(path, error)) {
-        cannotRead(path, error ? error.message() : "not a regular file");
+        throw Failure{ExitStatus::noInput, "cannot read " + path.string() + ": " +
+                                               (error ? error.message() : "not a regular file")};
     }
-    const std::uintmax_t size = std::filesystem::file_size(path, error);
-    if (error || size > longestFile) {
-        cannotRead(path, error ? error.message() : "longer than a settings file may be");
-    }
-    std::string text(static_cast<std::size_t>(size), '\0');
-    std::ifstream file{path, std::ios::binary};
-    if (!file.read(text.data(), static_cast<std::streamsize>(text.size()))) {
-        cannotRead(path, std::generic_category().message(errno));
-    }
-    return text;
+    return readFile(path, longestDocument);
 }
 
 /// Each dot of a key is a table in a table, which the parser takes apart by recursion.

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <cstdint>
+#include <cstddef>
 #include <filesystem>
 #include <string>
 #include <string_view>
@@ -11,7 +11,7 @@ namespace raidinfo::settings {
 
 /// Far more than a policy or a code book needs, and little enough that no file can take the
 /// program's memory, time or stack.
-constexpr std::uintmax_t longestFile = 256 * 1024;
+constexpr std::size_t longestDocument = std::size_t{256} * 1024;
 constexpr int deepestNesting = 16;
 constexpr int mostDotsOfALine = 32;
 

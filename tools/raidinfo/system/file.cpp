@@ -109,7 +109,7 @@ private:
 
 }  // namespace
 
-std::string readFile(const std::filesystem::path& path) {
+std::string readFile(const std::filesystem::path& path, std::size_t most) {
     const int number = opened(path, O_RDONLY);
     if (number < 0) {
         throw failure(ExitStatus::noInput, "cannot read", path);
@@ -126,9 +126,9 @@ std::string readFile(const std::filesystem::path& path) {
             return content;
         }
         content.append(piece.data(), static_cast<std::size_t>(size));
-        if (content.size() > longestFile) {
-            throw Failure{ExitStatus::badInput, path.string() + " is longer than " +
-                                                    std::to_string(longestFile) + " bytes"};
+        if (content.size() > most) {
+            throw Failure{ExitStatus::badInput,
+                          path.string() + " is longer than " + std::to_string(most) + " bytes"};
         }
     }
 }

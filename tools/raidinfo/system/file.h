@@ -12,8 +12,10 @@ namespace raidinfo {
 /// Longer than any recording that is of use, and short enough for the program's memory.
 constexpr std::size_t longestFile = std::size_t{256} * 1024 * 1024;
 
-/// The whole file; one that cannot be read is a noInput Failure, a longer one a badInput Failure.
-[[nodiscard]] std::string readFile(const std::filesystem::path& path);
+/// The whole file; one that cannot be read is a noInput Failure, one of more bytes a badInput
+/// Failure.
+[[nodiscard]] std::string readFile(const std::filesystem::path& path,
+                                   std::size_t most = longestFile);
 
 /// Writes the file beside its place and then moves it there, so that nobody ever sees half of it.
 /// Links stay links, and the file's mode stays what it was. What is no regular file, such as a

@@ -85,20 +85,25 @@ TEST(Document, IsRefusedWhereItNestsWithoutEnd) {
 TEST(Document, OfAFileThatCannotBeReadIsAFailureOfItsOwn) {
     std::filesystem::create_directory("folder");
     raid::test::makePipe("pipe");
-    writeFile("long", std::string(longestFile + 1, '\n'));
     for (const auto& [path, reason] : std::vector<std::pair<std::string, std::string>>{
              {"none", "No such file or directory"},
              {"none/below", "No such file or directory"},
              {"folder", "not a regular file"},
              {"pipe", "not a regular file"},
-             {"/dev/zero", "not a regular file"},
-             {"long", "longer than a settings file may be"}}) {
+             {"/dev/zero", "not a regular file"}}) {
         const std::string file = path;
         const Failure failure = failureOf([&file] { static_cast<void>(readDocument(file)); });
         EXPECT_EQ(failure.status(), ExitStatus::noInput);
         EXPECT_EQ(failure.what(), "cannot read " + path + ": " + reason);
     }
-    writeFile("long", std::string(longestFile, '\n'));
+}
+
+TEST(Document, IsRefusedWhereItsFileIsTooLong) {
+    writeFile("long", std::string(longestDocument + 1, '\n'));
+    const Failure failure = failureOf([] { static_cast<void>(readDocument("long")); });
+    EXPECT_EQ(failure.status(), ExitStatus::badInput);
+    EXPECT_STREQ(failure.what(), "long is longer than 262144 bytes");
+    writeFile("long", std::string(longestDocument, '\n'));
     EXPECT_NO_THROW(static_cast<void>(readDocument("long")));
 }
 
