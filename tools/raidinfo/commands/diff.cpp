@@ -2,6 +2,8 @@
 
 #include <nlohmann/json.hpp>
 #include <string>
+#include <utility>
+#include <vector>
 
 #include "commands/commands.h"
 #include "diff/snapshot_file.h"
@@ -16,11 +18,16 @@ namespace {
 constexpr int same = 0;
 constexpr int different = 1;
 
-Json inventoryIn(const std::string& path, const Session& session) {
+Json inventoryIn(const std::string& path, const Session& session, std::vector<Trouble>& troubles) {
     const std::string text = readFile(path);
     if (text.starts_with("raid-recording ")) {
-        return treeJson(
-            Trees{recordedInventory(session.library(), readRecording(path))}.adapters());
+        const recording::Recording recorded = readRecording(path);
+        Json tree = treeJson(Trees{recordedInventory(session.library(), recorded)}.adapters());
+        for (Trouble& trouble : troublesOf(recorded, path)) {
+            complain(trouble.message);
+            troubles.push_back(std::move(trouble));
+        }
+        return tree;
     }
     try {
         return diff::snapshotData(text);
@@ -32,12 +39,13 @@ Json inventoryIn(const std::string& path, const Session& session) {
 }  // namespace
 
 int runCommand(const Session& session, const DiffOptions& compared) {
-    const Json before = inventoryIn(compared.before, session);
+    std::vector<Trouble> troubles;
+    const Json before = inventoryIn(compared.before, session, troubles);
     const Json after = compared.after.empty() ? treeJson(session.inventory().adapters())
-                                              : inventoryIn(compared.after, session);
+                                              : inventoryIn(compared.after, session, troubles);
     const auto changes = diff::changes(before, after, session.codeBook());
     if (session.options().json) {
-        session.print(diff::changesData(changes));
+        session.print(diff::changesData(changes), std::move(troubles));
     } else {
         session.output().write(diff::told(changes));
     }

@@ -102,20 +102,21 @@ StreamStart startOf(const EventsOptions& options,
 void showRecorded(const Session& session, const StreamStart& start, const EventListener& listener) {
     Continuity continuity = start.shownBefore ? Continuity::after(*start.shownBefore)
                                               : Continuity{start.first.value_or(0)};
-    RecordReader reader{session.library()};
-    for (const recording::Entry& entry : session.recorded()->entries) {
-        if (entry.question != recording::Question::events || !entry.body) {
-            continue;
-        }
-        const auto batch = eventsIn(session.library(), reader, *entry.body);
-        if (!batch) {
-            continue;
-        }
+    RecordedEvents recorded{session.library(), *session.recorded()};
+    while (const auto batch = recorded.next()) {
         const bool wentBack = continuity.last() && greatestNumber(*batch) < *continuity.last();
         static_cast<void>(beginsAnew(continuity, *batch, wentBack, listener));
         if (!showBatch(continuity, *batch, listener)) {
             return;
         }
+    }
+    if (recorded.leftOut() > 0) {
+        listener.notice({troubleCode(ExitStatus::malformedAnswer),
+                         "recorded answers with events that are malformed and left out: " +
+                             std::to_string(recorded.leftOut())});
+    }
+    for (const auto& [code, message] : session.troublesOfSource()) {
+        listener.notice({code, message});
     }
 }
 

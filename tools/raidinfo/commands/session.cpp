@@ -3,6 +3,7 @@
 #include <unistd.h>
 
 #include <algorithm>
+#include <iterator>
 #include <nlohmann/json.hpp>
 #include <utility>
 
@@ -39,7 +40,11 @@ GridLayout Session::layout() const { return {.width = screen.width, .painter = p
 
 Trees Session::inventory() const {
     if (answers) {
-        return Trees{recordedInventory(lib, *answers)};
+        Trees trees{recordedInventory(lib, *answers)};
+        for (const Trouble& trouble : troublesOfSource()) {
+            complain(trouble.message);
+        }
+        return trees;
     }
     const Alarm alarm{chosen.limit, lib.function<void()>("cancelGetEvent")};
     try {
@@ -52,6 +57,10 @@ Trees Session::inventory() const {
     }
 }
 
+std::vector<Trouble> Session::troublesOfSource() const {
+    return answers ? troublesOf(*answers, chosen.recording->string()) : std::vector<Trouble>{};
+}
+
 const CodeBook& Session::codeBook() const {
     if (!book) {
         book = shippedCodeBook();
@@ -59,7 +68,8 @@ const CodeBook& Session::codeBook() const {
     return *book;
 }
 
-void Session::print(Json data, const std::vector<Trouble>& troubles) const {
+void Session::print(Json data, std::vector<Trouble> troubles) const {
+    std::ranges::move(troublesOfSource(), std::back_inserter(troubles));
     out.write(document(enveloped(sourceOf(chosen), troubles, std::move(data))));
 }
 
@@ -74,6 +84,13 @@ Source sourceOf(const Options& options) {
     }
     return options.recording ? Source{"recording", options.recording->string()}
                              : Source{"service", ServiceAddress::inShort()};
+}
+
+std::vector<Trouble> troublesOf(const recording::Recording& recorded, const std::string& name) {
+    return recorded.cutShort
+               ? std::vector<Trouble>{{"recording_cut_short",
+                                       name + ": the last entry is cut short and left out"}}
+               : std::vector<Trouble>{};
 }
 
 void complain(std::string message) {

@@ -59,8 +59,11 @@ public:
     /// What the service's numbers mean.
     [[nodiscard]] const CodeBook& codeBook() const;
 
+    /// What is missing in the recording; nothing where there is none.
+    [[nodiscard]] std::vector<Trouble> troublesOfSource() const;
+
     /// As JSON in its envelope, and as one line of a stream of such documents.
-    void print(Json data, const std::vector<Trouble>& troubles = {}) const;
+    void print(Json data, std::vector<Trouble> troubles = {}) const;
     void printLine(const std::vector<Trouble>& troubles, Json data) const;
 
 private:
@@ -75,6 +78,10 @@ private:
 
 /// What the JSON of these options tells about.
 [[nodiscard]] Source sourceOf(const Options& options);
+
+/// What is missing in the recording of this name.
+[[nodiscard]] std::vector<Trouble> troublesOf(const recording::Recording& recorded,
+                                              const std::string& name);
 
 /// One line on standard error, whatever the message holds.
 void complain(std::string message);

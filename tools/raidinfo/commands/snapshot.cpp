@@ -8,7 +8,8 @@ namespace raidinfo {
 
 int runCommand(const Session& session, const SnapshotOptions& snapshot) {
     Json data = treeJson(session.inventory().adapters());
-    const Json saved = enveloped(sourceOf(session.options()), {}, std::move(data));
+    const Json saved =
+        enveloped(sourceOf(session.options()), session.troublesOfSource(), std::move(data));
     if (isStandardOutput(snapshot.file)) {
         session.output().write(document(saved));
         return 0;

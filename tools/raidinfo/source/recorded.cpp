@@ -53,6 +53,13 @@ void callWithoutExchange(const Library& library, const char* function) {
     library.function<int()>(function)();
 }
 
+/// Of a recording without an answer to the question that this is about.
+Failure nothingRecorded(const recording::Recording& recorded, const std::string& what) {
+    return {ExitStatus::serviceUnavailable,
+            "the recording holds no " + what +
+                (recorded.cutShort ? "; its last entry is cut short" : "")};
+}
+
 }  // namespace
 
 recording::Recording readRecording(const std::filesystem::path& path) {
@@ -77,7 +84,7 @@ Inventory recordedInventory(const Library& library, const recording::Recording& 
         }
     }
     if (!isAnswered) {
-        throw Failure{ExitStatus::serviceUnavailable, "the recording holds no configuration"};
+        throw nothingRecorded(recorded, "configuration");
     }
     if (!isRead) {
         throw malformedAnswer();
@@ -94,6 +101,28 @@ std::optional<Records> eventsIn(const Library& library, RecordReader& reader,
     }
     callWithoutExchange(library, "getEvent");
     return reader.read(eventKind());
+}
+
+RecordedEvents::RecordedEvents(const Library& loaded, const recording::Recording& read)
+    : library{loaded}, recorded{read}, reader{loaded} {}
+
+std::optional<Records> RecordedEvents::next() {
+    for (; place != recorded.entries.size(); ++place) {
+        const recording::Entry& entry = recorded.entries[place];
+        if (entry.question != Question::events || !entry.body) {
+            continue;
+        }
+        if (auto batch = eventsIn(library, reader, *entry.body)) {
+            ++place;
+            ++wellFormed;
+            return batch;
+        }
+        ++malformed;
+    }
+    if (wellFormed == 0) {
+        throw malformed == 0 ? nothingRecorded(recorded, "events") : malformedAnswer();
+    }
+    return std::nullopt;
 }
 
 }  // namespace raidinfo

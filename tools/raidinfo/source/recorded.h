@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <filesystem>
 #include <optional>
 #include <string>
@@ -22,5 +23,26 @@ namespace raidinfo {
 /// The events of an answer's body; nothing where the library cannot read it.
 [[nodiscard]] std::optional<Records> eventsIn(const Library& library, RecordReader& reader,
                                               const std::string& body);
+
+/// The answers of a recording with events, one after the other.
+class RecordedEvents {
+public:
+    RecordedEvents(const Library& loaded, const recording::Recording& read);
+
+    /// The events of the next answer that the library can read, which may be none; nothing at the
+    /// end. A recording without such an answer fails as recordedInventory does.
+    [[nodiscard]] std::optional<Records> next();
+
+    /// How many answers were left out so far, for the library cannot read them.
+    [[nodiscard]] std::size_t leftOut() const noexcept { return malformed; }
+
+private:
+    const Library& library;
+    const recording::Recording& recorded;
+    RecordReader reader;
+    std::size_t place = 0;
+    std::size_t wellFormed = 0;
+    std::size_t malformed = 0;
+};
 
 }  // namespace raidinfo
