@@ -17,11 +17,12 @@ LAYERS = {
     "tools/raidsim": "xml soap http state fault control generate net",
 }
 
-# By the folder that includes them. The classes of the model have their getters inline; the two others
-# tell how the library asks, and what it takes for space.
+# By the folder that includes them. The classes of the model have their getters inline; the others
+# tell how the library asks, how it reads its settings, and what it takes for space.
 TAKEN_FROM_SOURCES = {
     "tools/raidinfo/inventory": {"model/system_and_adapter.h"},
     "tools/raidinfo/redact": {"xml/space.h"},
+    "tools/raidinfo/doctor": {"orvo/property_file.h"},
     "tools/raidinfo/source": {"agent/requests.h", "model/system_and_adapter.h"},
 }
 

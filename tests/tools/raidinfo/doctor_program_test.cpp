@@ -3,17 +3,21 @@
 
 #include <filesystem>
 #include <nlohmann/json.hpp>
+#include <string>
+#include <vector>
 
 #include "documents.h"
 #include "program.h"
 #include "scripted.h"
 #include "support/busy_service.h"
+#include "support/files.h"
 
 namespace raidinfo::test {
 namespace {
 
 using nlohmann::json;
 using raid::test::BusyService;
+using raid::test::writeFile;
 using testing::AllOf;
 using testing::ContainsRegex;
 using testing::HasSubstr;
@@ -21,9 +25,27 @@ using testing::HasSubstr;
 // The doctor only looks whether somebody listens, then it asks.
 const Connection probe{.end = End::close};
 
+const Connection sevenIsNewest = answering(newestEventDocument("7"));
+const Connection otherPage = answering("<html><body>It works</body></html>");
+
+std::vector<Connection> healthy() {
+    return {probe, sevenIsNewest, answering(configuration(sampleAdapter())),
+            answering(eventBatch({7}))};
+}
+
+// What the JSON says of one check.
+json findingOf(const std::string& check, const Result& result) {
+    const json document = json::parse(result.output);
+    for (const json& finding : document["data"]["findings"]) {
+        if (finding["check"] == check) {
+            return finding;
+        }
+    }
+    return {};
+}
+
 TEST(DoctorCommand, FindsNothingWrong) {
-    const ScriptedService service{
-        {probe, answering(newestEventDocument("7")), answering(configuration(sampleAdapter()))}};
+    const ScriptedService service{healthy()};
     const Result result = run({"doctor"});
     EXPECT_EQ(result.errors, "");
     EXPECT_EQ(result.status, 0);
@@ -33,7 +55,9 @@ TEST(DoctorCommand, FindsNothingWrong) {
                       ContainsRegex("Service listens +ok +127.0.0.1 port 34572"),
                       ContainsRegex("Service answers +ok +its newest event is 7"),
                       ContainsRegex("Configuration +ok +well-formed"),
-                      ContainsRegex("Lists +ok +1 pellion_adapters, 2 channels")));
+                      ContainsRegex("Lists +ok +1 pellion_adapters, 2 channels"),
+                      ContainsRegex("Events +ok +well-formed")));
+    EXPECT_THAT(service.request(3), HasSubstr(">7</as:start>"));
 }
 
 TEST(DoctorCommand, SaysThatNobodyListens) {
@@ -81,15 +105,82 @@ TEST(DoctorCommand, GivesUpOnAServiceThatAcceptsNoConnection) {
 TEST(DoctorCommand, TellsTheReadersOwnMessageOfAMalformedAnswer) {
     const std::string adapter = complex("adapter", "o:LSIAdapter", simple({{"colour", "red"}}));
     const ScriptedService service{
-        {probe, answering(newestEventDocument("7")), answering(configuration(adapter))}};
+        {probe, sevenIsNewest, answering(configuration(adapter)), answering(eventBatch({7}))}};
     const Result result = run({"doctor"});
     EXPECT_EQ(result.status, 76);
     EXPECT_THAT(result.output, ContainsRegex("Configuration +bad +XML syntax error: .*colour"));
 }
 
-TEST(DoctorCommand, LeavesNothingBehind) {
+TEST(DoctorCommand, TellsMalformedEventsInTheReadersOwnWords) {
+    std::string events = eventBatch({7});
+    events.replace(events.find("<as:sequenceNumber"), 0, "<as:colour>red</as:colour>");
+    for (const std::string& body : {events, eventBatch({7}).substr(0, 400)}) {
+        const ScriptedService service{
+            {probe, sevenIsNewest, answering(configuration(sampleAdapter())), answering(body)}};
+        const Result result = run({"doctor"});
+        EXPECT_EQ(result.status, 76);
+        EXPECT_THAT(result.output, AllOf(ContainsRegex("Lists +ok"),
+                                         ContainsRegex("Events +bad +XML syntax error: ")));
+    }
+}
+
+TEST(DoctorCommand, LooksAtEverythingElseOfAServiceWithoutEvents) {
     const ScriptedService service{
-        {probe, answering(newestEventDocument("7")), answering(configuration(sampleAdapter()))}};
+        {probe, otherPage, otherPage, answering(configuration(sampleAdapter())), otherPage}};
+    const Result result = run({"doctor"});
+    EXPECT_EQ(result.status, 76);
+    const std::string said = " +bad +not an answer to the question: it begins with \"<html>";
+    EXPECT_THAT(result.output, AllOf(ContainsRegex("Service answers" + said),
+                                     ContainsRegex("Lists +ok"), ContainsRegex("Events" + said)));
+}
+
+TEST(DoctorCommand, TakesAServiceWithoutAnyEventForWell) {
+    const ScriptedService service{
+        {probe, answering(newestEventDocument("0")), answering(newestEventDocument("0")),
+         answering(configuration(sampleAdapter())), answering(eventBatch({}))}};
+    const Result result = run({"doctor"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.output, AllOf(ContainsRegex("Service answers +ok +its newest event is 0"),
+                                     ContainsRegex("Events +ok")));
+}
+
+TEST(DoctorCommand, SaysThatTheQuestionForEventsGetsNoAnswer) {
+    std::vector<Connection> script = healthy();
+    script.back() = Connection{};
+    const ScriptedService service{script};
+    const Result result = run({"doctor"});
+    EXPECT_EQ(result.status, 69);
+    EXPECT_THAT(result.output, ContainsRegex("Events +bad +it gave no answer"));
+}
+
+TEST(DoctorCommand, TellsHowThePageOfAnotherServerBegins) {
+    const ScriptedService service{
+        {probe, sevenIsNewest, otherPage, otherPage, answering(eventBatch({7}))}};
+    const Result result = run({"doctor", "--json"});
+    EXPECT_EQ(result.status, 76);
+    const std::string told =
+        "not an answer to the question: it begins with \"<html><body>It works</body></html>\"";
+    EXPECT_EQ(findingOf("well_formed", result)["finding"], told);
+    EXPECT_EQ(json::parse(result.output)["errors"].size(), 1U);
+    EXPECT_EQ(findingOf("events", result)["outcome"], "ok");
+}
+
+TEST(DoctorCommand, GoesOnWithoutAPlaceForTheLog) {
+    const ScriptedService service{{probe, sevenIsNewest, answering(configuration(sampleAdapter())),
+                                   answering(eventBatch({7}).substr(0, 400))}};
+    Program doctor{{"/usr/bin/env", "TMPDIR=/nowhere", RAIDINFO_PROGRAM, "doctor"}};
+    const Result result = doctor.finish();
+    EXPECT_EQ(result.errors, "");
+    EXPECT_EQ(result.status, 76);
+    EXPECT_THAT(result.output,
+                AllOf(ContainsRegex("Configuration +ok"),
+                      ContainsRegex("Events +bad +malformed; what the library says of it is not "
+                                    "known, for there is no temporary folder: No such file or "
+                                    "directory; it begins with \"<.xml")));
+}
+
+TEST(DoctorCommand, LeavesNothingBehind) {
+    const ScriptedService service{healthy()};
     Program doctor{{"/usr/bin/env", "TMPDIR=.", RAIDINFO_PROGRAM, "doctor"}};
     EXPECT_EQ(doctor.finish().status, 0);
     EXPECT_TRUE(std::filesystem::is_empty(std::filesystem::current_path()));
@@ -97,11 +188,60 @@ TEST(DoctorCommand, LeavesNothingBehind) {
 
 TEST(DoctorCommand, FindsTheSystemWithoutAnAdapterNoteworthy) {
     const ScriptedService service{
-        {probe, answering(newestEventDocument("7")), answering(configuration(""))}};
-    const json document = json::parse(run({"doctor", "--json"}).output);
-    const json last = document["data"]["findings"].back();
-    EXPECT_EQ(last["check"], "published");
-    EXPECT_EQ(last["outcome"], "look");
+        {probe, sevenIsNewest, answering(configuration("")), answering(eventBatch({7}))}};
+    const Result result = run({"doctor", "--json"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_EQ(findingOf("published", result)["outcome"], "look");
+}
+
+// What the doctor says of settings file and log, though no service is there.
+class DoctorsHint : public testing::Test {
+protected:
+    static json of(const std::string& check) { return findingOf(check, run({"doctor", "--json"})); }
+
+    static void expectLook(const std::string& check, const std::string& finding) {
+        const json found = of(check);
+        EXPECT_EQ(found["outcome"], "look");
+        EXPECT_THAT(found["finding"].get<std::string>(), testing::EndsWith(finding));
+    }
+
+    static void expectOfSettings(const std::string& text, const std::string& finding) {
+        writeFile(raid::test::settingsPath, text);
+        expectLook("settings", "/logs/RAIDInstrumentation.ini: " + finding);
+    }
+};
+
+TEST_F(DoctorsHint, NamesTheLevelOfTheSettingsFile) {
+    raid::test::writeLogLevel(8);
+    EXPECT_EQ(of("settings")["outcome"], "ok");
+    EXPECT_THAT(of("settings")["finding"].get<std::string>(),
+                testing::EndsWith("RAIDInstrumentation.ini; log level 8"));
+}
+
+TEST_F(DoctorsHint, SaysWhyTheSettingsFileHasNoLevel) {
+    expectOfSettings("", "it has no LogLevel; log level 0");
+    expectOfSettings("loglevel=8\n", "it has no LogLevel; log level 0");
+    expectOfSettings("LogLevel=high\n", "its LogLevel \"high\" is not a number; log level 0");
+    expectOfSettings("LogLevel=\n", "its LogLevel \"\" is not a number; log level 0");
+    expectOfSettings(std::string(2'000'000, '#'),
+                     "it is longer than 1048576 bytes, and is not read; log level 0");
+}
+
+TEST_F(DoctorsHint, SaysThatANegativeLevelLogsNothing) {
+    raid::test::writeLogLevel(-8);
+    expectLook("settings", "RAIDInstrumentation.ini; log level -8, which logs nothing, as 0 does");
+    EXPECT_THAT(of("log")["finding"].get<std::string>(), testing::EndsWith(", which is off"));
+}
+
+TEST_F(DoctorsHint, SaysThatASettingsFileIsAFolder) {
+    std::filesystem::create_directory(raid::test::settingsPath);
+    expectLook("settings", "it is not a regular file, and is not read; log level 0");
+}
+
+TEST_F(DoctorsHint, SaysThatTheLogIsAFolder) {
+    raid::test::writeLogLevel(8);
+    std::filesystem::create_directory(raid::test::logPath);
+    expectLook("log", "RAIDInstrumentation.log: Is a directory; nothing is logged");
 }
 
 }  // namespace

@@ -47,8 +47,8 @@ int runCommand(const Session& session, const DoctorOptions& /*doctor*/) {
     const auto limit = session.options().limit;
     examine(session.library(), limit, [&](const Examined& found) {
         if (found.outcome == Examined::Outcome::bad) {
-            status = found.status;
-            troubles.push_back({troubleCode(status), found.finding});
+            status = status == ExitStatus::ok ? found.status : status;
+            troubles.push_back({troubleCode(found.status), found.finding});
         }
         if (session.options().json) {
             findings.push_back(entry(found));

@@ -5,19 +5,16 @@
 #include <netinet/in.h>
 #include <poll.h>
 #include <sys/socket.h>
-#include <unistd.h>
 
 #include <algorithm>
-#include <array>
 #include <cerrno>
 #include <filesystem>
 #include <optional>
-#include <stop_token>
 #include <system_error>
-#include <utility>
 #include <vector>
 
-#include "doctor/library_log.h"
+#include "doctor/answers.h"
+#include "doctor/settings_and_log.h"
 #include "inventory/kinds.h"
 #include "source/service_address.h"
 #include "system/alarm.h"
@@ -34,15 +31,6 @@ using Limit = std::optional<std::chrono::milliseconds>;
 
 constexpr int bitsOfAByte = 8;
 
-/// Where the library looks for a file beside the working directory; nowhere if that is gone.
-std::optional<fs::path> placeOf(const fs::path& name) {
-    std::error_code unknown;
-    const fs::path here = fs::current_path(unknown);
-    return unknown ? std::nullopt : std::optional{(here / "../logs" / name).lexically_normal()};
-}
-
-constexpr auto nowhere = "nowhere, for the working directory is gone";
-
 Examined loadedFile(const Library& library) {
     Dl_info information{};
     const std::string width = std::to_string(sizeof(void*) * bitsOfAByte) + " bits";
@@ -52,32 +40,6 @@ Examined loadedFile(const Library& library) {
     const fs::path file = known ? fs::canonical(information.dli_fname, unknown) : fs::path{};
     return {"library", "Library", Outcome::fine,
             (known && !unknown ? file.string() : "an unknown file") + ", " + width};
-}
-
-Examined settings(const Library& library) {
-    const int level = *library.variable<int>("LOG_LEVEL");
-    const auto place = placeOf("RAIDInstrumentation.ini");
-    std::error_code unknown;
-    const bool isMissing = place && !fs::exists(*place, unknown);
-    return {"settings", "Settings file", Outcome::fine,
-            (place ? place->string() : nowhere) + (isMissing ? ", which is not there" : "") +
-                "; log level " + std::to_string(level)};
-}
-
-Examined log(const Library& library) {
-    const auto place = placeOf("RAIDInstrumentation.log");
-    if (*library.variable<int>("LOG_LEVEL") == 0) {
-        return {"log", "Log file", Outcome::fine,
-                (place ? place->string() : nowhere) + std::string{", which is off"}};
-    }
-    if (!place) {
-        return {"log", "Log file", Outcome::noteworthy, nowhere};
-    }
-    std::error_code unknown;
-    const fs::path written = fs::exists(*place, unknown) ? *place : place->parent_path();
-    const bool writable = access(written.c_str(), W_OK) == 0;
-    return {"log", "Log file", writable ? Outcome::fine : Outcome::noteworthy,
-            place->string() + (writable ? "" : ": " + std::generic_category().message(errno))};
 }
 
 /// Waits for the connection that the socket has begun; returns what went wrong, or 0.
@@ -115,32 +77,6 @@ Examined listening(const Limit& limit) {
         ExitStatus::serviceUnavailable};
 }
 
-Examined answering(const Library& library) {
-    if (library.function<int()>("enableRAIDEvent")() == 0) {
-        return {"answering", "Service answers", Outcome::bad,
-                "it accepts connections and gives no answer", ExitStatus::serviceUnavailable};
-    }
-    const int newest = *library.variable<int>("nextSequenceNumber");
-    return {"answering", "Service answers", Outcome::fine,
-            "its newest event is " + std::to_string(newest)};
-}
-
-Examined wellFormed(const Library& library, const std::stop_token& over) {
-    const LibraryLog log{library};
-    library.function<int()>("RAIDinit")();
-    if (*library.variable<const void*>("raidSystem") != nullptr) {
-        return {"well_formed", "Configuration", Outcome::fine, "well-formed"};
-    }
-    if (over.stop_requested()) {
-        return {"well_formed", "Configuration", Outcome::bad,
-                "it gave no answer within the --timeout", ExitStatus::serviceUnavailable};
-    }
-    const std::string message = log.lastError();
-    return {"well_formed", "Configuration", Outcome::bad,
-            message.empty() ? "no answer, or one that is not whole" : message,
-            ExitStatus::malformedAnswer};
-}
-
 Examined published(const Library& library) {
     std::vector<std::string> counts;
     int adapters = 0;
@@ -158,35 +94,34 @@ Examined published(const Library& library) {
 
 }  // namespace
 
-std::string_view wordOf(Outcome outcome) noexcept {
-    constexpr auto words = std::to_array<std::string_view>({"ok", "look", "bad"});
-    return words.at(static_cast<std::size_t>(outcome));
-}
-
 void examine(const Library& library, std::optional<std::chrono::milliseconds> limit,
              const std::function<void(const Examined&)>& tell) {
-    const auto toldIsBad = [&tell](const Examined& found) {
+    const auto isGone = [&tell](const Examined& found) {
         tell(found);
-        return found.outcome == Outcome::bad;
+        return found.status == ExitStatus::serviceUnavailable;
     };
     tell(loadedFile(library));
+    readSettings(library);
+    tell(examinedSettings(library));
+    tell(examinedLog(library));
     const auto begun = Clock::now();
-    const Examined service = listening(limit);
-    const auto passed = std::chrono::floor<std::chrono::milliseconds>(Clock::now() - begun);
-    if (limit && passed >= *limit && service.outcome == Outcome::bad) {
-        tell(service);
+    if (isGone(listening(limit))) {
         return;
     }
+    const auto passed = std::chrono::floor<std::chrono::milliseconds>(Clock::now() - begun);
     const Limit left = limit ? Limit{std::max(*limit - passed, Limit::value_type{1})} : limit;
     const Alarm alarm{left, library.function<void()>("cancelGetEvent")};
-    // The library reads its settings with the first exchange.
-    const Examined answer = answering(library);
-    tell(settings(library));
-    tell(log(library));
-    if (toldIsBad(service) || toldIsBad(answer) || toldIsBad(wellFormed(library, alarm.over()))) {
+    if (isGone(examinedNewestEvent(library, alarm.over()))) {
         return;
     }
-    tell(published(library));
+    const Examined configuration = examinedConfiguration(library, alarm.over());
+    if (isGone(configuration)) {
+        return;
+    }
+    if (configuration.outcome == Outcome::fine) {
+        tell(published(library));
+    }
+    tell(examinedEvents(library, alarm.over()));
 }
 
 }  // namespace raidinfo

@@ -1,9 +1,9 @@
 #include "doctor/library_log.h"
 
 #include <algorithm>
-#include <cerrno>
-#include <cstdlib>
+#include <filesystem>
 #include <system_error>
+#include <utility>
 
 #include "system/file.h"
 
@@ -12,42 +12,37 @@ namespace {
 
 namespace fs = std::filesystem;
 
-fs::path makeFolder() {
-    std::string name = (fs::temp_directory_path() / "raidinfo-XXXXXX").string();
-    if (mkdtemp(name.data()) == nullptr) {
-        throw std::system_error{errno, std::generic_category(), "cannot make a folder"};
-    }
-    return name;
-}
+constexpr int ofErrors = 1;
 
-fs::path currentFolder() {
-    std::error_code gone;
-    return fs::current_path(gone);
+/// The folder to work in, so that the one for the log is beside it.
+fs::path foldersIn(const fs::path& folder) {
+    fs::create_directory(folder / "logs");
+    fs::create_directory(folder / "run");
+    return folder / "run";
 }
 
 }  // namespace
 
-LibraryLog::LibraryLog(const Library& library)
-    : before{currentFolder()},
-      folder{makeFolder()},
-      level{library.variable<int>("LOG_LEVEL")},
-      levelBefore{*level} {
-    fs::create_directory(folder / "logs");
-    fs::create_directory(folder / "run");
-    fs::current_path(folder / "run");
-    *level = 1;
-}
+LibraryLog::Level::Level(const Library& library)
+    : level{*library.variable<int>("LOG_LEVEL")}, before{std::exchange(level, ofErrors)} {}
 
-LibraryLog::~LibraryLog() {
-    *level = levelBefore;
-    std::error_code failed;
-    fs::current_path(before.empty() ? fs::path{"/"} : before, failed);
-    fs::remove_all(folder, failed);
+LibraryLog::Level::~Level() { level = before; }
+
+LibraryLog::Place::Place(const Library& library)
+    : working{foldersIn(folder.path())}, level{library} {}
+
+LibraryLog::LibraryLog(const Library& library) {
+    try {
+        place.emplace(library);
+    } catch (const std::system_error& error) {
+        reason = "there is no temporary folder: " + error.code().message();
+    }
 }
 
 std::string LibraryLog::lastError() const {
-    const fs::path file = folder / "logs/RAIDInstrumentation.log";
     std::error_code unknown;
+    const fs::path file =
+        place ? place->folder.path() / "logs/RAIDInstrumentation.log" : fs::path{};
     if (!fs::exists(file, unknown)) {
         return "";
     }

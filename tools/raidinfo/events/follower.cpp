@@ -6,7 +6,6 @@
 #include <optional>
 #include <string>
 
-#include "agent/requests.h"
 #include "events/gap_search.h"
 #include "events/wait.h"
 #include "source/exchange.h"
@@ -32,7 +31,7 @@ class Follower {
 public:
     Follower(const Library& library, const StreamStart& start, const EventListener& told)
         : wait{library},
-          ask{library},
+          service{library},
           gap{library},
           askNewest{library.function<int()>("enableRAIDEvent")},
           nextNumber{library.variable<int>("nextSequenceNumber")},
@@ -135,8 +134,7 @@ private:
     /// the events from the same number on, so that an event which used the last number once more
     /// meanwhile would be missed.
     [[nodiscard]] bool isNextThere() const {
-        return ask(raid::agent::waitNextEventRequest(boundedNumber(continuity->next() - 1)))
-            .has_value();
+        return service.nextEvent(continuity->next() - 1).has_value();
     }
 
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to
@@ -201,7 +199,7 @@ private:
     }
 
     EventWait wait;
-    Exchange ask;
+    Exchange service;
     GapSearch gap;
     int (*askNewest)();
     const int* nextNumber;  ///< the library's, which askNewest sets to the newest

@@ -2,7 +2,6 @@
 
 #include <algorithm>
 
-#include "agent/requests.h"
 #include "source/recorded.h"
 
 namespace raidinfo {
@@ -25,14 +24,13 @@ std::optional<std::int64_t> leastIn(const Records& batch, std::int64_t first) {
 }  // namespace
 
 GapSearch::GapSearch(const Library& searched)
-    : library{searched}, reader{searched}, ask{searched} {}
+    : library{searched}, reader{searched}, service{searched} {}
 
 std::optional<std::int64_t> GapSearch::leastNumber(std::int64_t first, std::int64_t last,
                                                    const std::stop_token& stop) {
     for (std::int64_t width = growth * numbersAsked; first <= last; width *= growth) {
         const std::int64_t end = std::min(first + width - 1, last);
-        const auto answer =
-            ask(raid::agent::eventsRequest(boundedNumber(first), boundedNumber(end)));
+        const auto answer = service.events(first, end);
         const auto batch = answer ? eventsIn(library, reader, *answer) : std::nullopt;
         if (!batch || stop.stop_requested()) {
             return std::nullopt;

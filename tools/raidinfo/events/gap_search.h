@@ -25,7 +25,7 @@ public:
 private:
     const Library& library;
     RecordReader reader;
-    Exchange ask;
+    Exchange service;
 };
 
 }  // namespace raidinfo

@@ -5,23 +5,49 @@
 #include <limits>
 #include <memory>
 
+#include "agent/requests.h"
+
 namespace raidinfo {
+namespace {
+
+struct FreeBytes {
+    void operator()(char* bytes) const {
+        std::free(bytes);  // NOLINT(cppcoreguidelines-no-malloc): the library's is malloc'ed
+    }
+};
+
+int bounded(std::int64_t number) {
+    return static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max()));
+}
+
+}  // namespace
 
 Exchange::Exchange(const Library& library)
     : exchange{library.function<char*(const char*)>("_Z11getSOAPDataPKc")} {}
 
-std::optional<std::string> Exchange::operator()(const std::string& request) const {
-    struct Free {
-        void operator()(char* bytes) const {
-            std::free(bytes);  // NOLINT(cppcoreguidelines-no-malloc): the library's is malloc'ed
-        }
-    };
-    const std::unique_ptr<char, Free> body{exchange(request.c_str())};
-    return body ? std::optional<std::string>{body.get()} : std::nullopt;
+std::optional<std::string> Exchange::configuration() const {
+    return answerTo(raid::agent::configurationRequest);
 }
 
-int boundedNumber(std::int64_t number) noexcept {
-    return static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max()));
+std::optional<std::string> Exchange::newestEvent() const {
+    return answerTo(raid::agent::newestEventRequest());
+}
+
+std::optional<std::string> Exchange::allEvents() const {
+    return answerTo(raid::agent::eventListRequest);
+}
+
+std::optional<std::string> Exchange::events(std::int64_t first, std::int64_t last) const {
+    return answerTo(raid::agent::eventsRequest(bounded(first), bounded(last)));
+}
+
+std::optional<std::string> Exchange::nextEvent(std::int64_t number) const {
+    return answerTo(raid::agent::waitNextEventRequest(bounded(number)));
+}
+
+std::optional<std::string> Exchange::answerTo(const std::string& request) const {
+    const std::unique_ptr<char, FreeBytes> body{exchange(request.c_str())};
+    return body ? std::optional<std::string>{body.get()} : std::nullopt;
 }
 
 }  // namespace raidinfo

@@ -5,7 +5,6 @@
 #include <string>
 #include <utility>
 
-#include "agent/requests.h"
 #include "source/exchange.h"
 #include "source/recorded.h"
 #include "source/service_failures.h"
@@ -22,7 +21,7 @@ class Recorder {
 public:
     Recorder(const Library& loaded, const EntrySink& destination, std::stop_token whenOver)
         : library{loaded},
-          ask{loaded},
+          service{loaded},
           askNewest{loaded.function<int()>("enableRAIDEvent")},
           newest{loaded.variable<int>("nextSequenceNumber")},
           reader{loaded},
@@ -31,9 +30,9 @@ public:
 
     /// All events that there are, and the configuration. Returns whether the service answers.
     bool recordAll() {
-        const auto newestEvent = ask(raid::agent::newestEventRequest());
-        const auto events = ask(raid::agent::eventListRequest);
-        const auto configuration = ask(raid::agent::configurationRequest);
+        const auto newestEvent = service.newestEvent();
+        const auto events = service.allEvents();
+        const auto configuration = service.configuration();
         if (!configuration) {
             return false;
         }
@@ -59,7 +58,7 @@ public:
             isDoubtful = !recordAll();
             return false;
         }
-        if (newestNumber <= last && !ask(raid::agent::waitNextEventRequest(boundedNumber(last)))) {
+        if (newestNumber <= last && !service.nextEvent(last)) {
             isDoubtful = true;
             return false;
         }
@@ -70,11 +69,11 @@ private:
     /// The configuration is asked for after the events and written before them, so that it knows
     /// the names of all that they tell about.
     bool recordEventsUpTo(std::int64_t newestNumber) {
-        auto events = ask(raid::agent::eventsRequest(boundedNumber(last + 1),
-                                                     boundedNumber(last + numbersAsked)));
+        // With the last one, for another event may use its number once more.
+        auto events = service.events(last, last + numbersAsked);
         auto greatest = greatestIn(events);
-        if (greatest == 0 && newestNumber > last + numbersAsked) {
-            events = ask(raid::agent::eventListRequest);  // The numbers asked for are passed over.
+        if (greatest && *greatest <= last && newestNumber > last + numbersAsked) {
+            events = service.allEvents();  // The numbers asked for are passed over.
             greatest = greatestIn(events);
         }
         if (!events) {
@@ -84,7 +83,7 @@ private:
         if (greatest && *greatest <= last) {
             return false;
         }
-        const auto configuration = ask(raid::agent::configurationRequest);
+        const auto configuration = service.configuration();
         if (over.stop_requested()) {
             return false;
         }
@@ -115,7 +114,7 @@ private:
     }
 
     const Library& library;
-    Exchange ask;
+    Exchange service;
     int (*askNewest)();
     const int* newest;  ///< the library's next number, which askNewest sets to the newest
     RecordReader reader;

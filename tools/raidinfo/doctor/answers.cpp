@@ -1,0 +1,121 @@
+#include "doctor/answers.h"
+
+#include <algorithm>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+#include "doctor/library_log.h"
+#include "source/exchange.h"
+#include "source/recorded.h"
+
+namespace raidinfo {
+namespace {
+
+using Outcome = Examined::Outcome;
+
+constexpr std::string_view blanks = " \t\r\n";
+
+Examined withoutAnswer(Examined found, const std::stop_token& over, const char* what) {
+    found.outcome = Outcome::bad;
+    found.finding = over.stop_requested() ? "it gave no answer within the --timeout" : what;
+    found.status = ExitStatus::serviceUnavailable;
+    return found;
+}
+
+/// Enough of it to tell a page of another server from an answer.
+std::string beginningOf(const std::string& body) {
+    constexpr std::size_t longest = 60;
+    if (body.empty()) {
+        return "it is empty";
+    }
+    std::string text = body.substr(0, longest);
+    std::ranges::replace_if(
+        text, [](char c) { return blanks.find(c) != std::string_view::npos; }, ' ');
+    return "it begins with \"" + text + (body.size() > longest ? "...\"" : "\"");
+}
+
+/// In the words of the library's reader; it has none for what it does not take for an answer.
+Examined malformed(Examined found, const LibraryLog& log, const std::string& body) {
+    found.outcome = Outcome::bad;
+    found.status = ExitStatus::malformedAnswer;
+    found.finding = log.lastError();
+    if (found.finding.empty()) {
+        found.finding =
+            (log.trouble().empty() ? "not an answer to the question: "
+                                   : "malformed; what the library says of it is not known, for " +
+                                         log.trouble() + "; ") +
+            beginningOf(body);
+    }
+    return found;
+}
+
+/// Whether it stands between two tags.
+bool hasNumber(std::string_view body, int number) {
+    const std::string expected = std::to_string(number);
+    for (std::size_t tagEnd = body.find('>'); tagEnd != std::string_view::npos;
+         tagEnd = body.find('>', tagEnd + 1)) {
+        const std::size_t begin = body.find_first_not_of(blanks, tagEnd + 1);
+        const std::string_view text =
+            body.substr(std::min(begin, body.size())).substr(0, expected.size());
+        const std::size_t behind =
+            body.find_first_not_of(blanks, std::min(begin, body.size()) + text.size());
+        if (text == expected && behind != std::string_view::npos && body[behind] == '<') {
+            return true;
+        }
+    }
+    return false;
+}
+
+}  // namespace
+
+Examined examinedNewestEvent(const Library& library, const std::stop_token& over) {
+    Examined found{"answering", "Service answers", Outcome::fine, ""};
+    const auto* const none = "it accepts connections and gives no answer";
+    const LibraryLog log{library};
+    if (library.function<int()>("enableRAIDEvent")() == 0) {
+        return withoutAnswer(found, over, none);
+    }
+    const int newest = *library.variable<int>("nextSequenceNumber");
+    found.finding = "its newest event is " + std::to_string(newest);
+    if (newest != 0) {
+        return found;
+    }
+    // The library makes 0 of an answer that it cannot read, too.
+    const auto body = Exchange{library}.newestEvent();
+    if (!body) {
+        return withoutAnswer(found, over, none);
+    }
+    return hasNumber(*body, newest) ? found : malformed(found, log, *body);
+}
+
+Examined examinedConfiguration(const Library& library, const std::stop_token& over) {
+    Examined found{"well_formed", "Configuration", Outcome::fine, "well-formed"};
+    const LibraryLog log{library};
+    library.function<int()>("RAIDinit")();
+    if (*library.variable<const void*>("raidSystem") != nullptr) {
+        return found;
+    }
+    std::optional<std::string> body;
+    if (!log.lastError().empty()) {
+        body = "";  // A reader that says something has had an answer.
+    } else if (!over.stop_requested()) {
+        body = Exchange{library}.configuration();
+    }
+    return body ? malformed(found, log, *body) : withoutAnswer(found, over, "it gave no answer");
+}
+
+Examined examinedEvents(const Library& library, const std::stop_token& over) {
+    Examined found{"events", "Events", Outcome::fine, "well-formed"};
+    const LibraryLog log{library};
+    const std::int64_t newest = *library.variable<int>("nextSequenceNumber");
+    const auto body = Exchange{library}.events(newest, newest + numbersAsked - 1);
+    if (!body) {
+        return withoutAnswer(found, over, "it gave no answer");
+    }
+    RecordReader reader{library};
+    return eventsIn(library, reader, *body) ? found : malformed(found, log, *body);
+}
+
+}  // namespace raidinfo
