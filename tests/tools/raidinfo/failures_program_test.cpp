@@ -6,10 +6,12 @@
 #include <csignal>
 #include <nlohmann/json.hpp>
 #include <tuple>
+#include <utility>
 
 #include "documents.h"
 #include "program.h"
 #include "scripted.h"
+#include "simulator.h"
 #include "support/busy_service.h"
 #include "support/files.h"
 #include "support/socket.h"
@@ -195,9 +197,25 @@ TEST(FailingProgram, SaysThatItsOutputCannotBeWritten) {
         "No space left on device");
 }
 
+// The subcommand, and how it ends where it must print and cannot.
+Result withoutOutput(const std::string& arguments) {
+    return Program{{"/bin/sh", "-c", "exec \"$0\" " + arguments + " >&-", RAIDINFO_PROGRAM}}
+        .finish();
+}
+
 TEST(FailingProgram, SaysThatItHasNoStandardOutput) {
-    expectFailure(Program{{"/bin/sh", "-c", "exec \"$0\" list >&-", RAIDINFO_PROGRAM}}.finish(), 74,
-                  "cannot write the output");
+    const Simulator service{"small-server.xml"};
+    EXPECT_EQ(withoutOutput("snapshot before.json").status, 0);
+    for (const auto& [arguments, status] :
+         {std::pair{"list", 74}, {"diff before.json", 2}, {"health", 3}, {"--version", 74}}) {
+        expectFailure(withoutOutput(arguments), status, "cannot write the output");
+    }
+}
+
+TEST(FailingProgram, NeedsNoStandardOutputToWriteAFile) {
+    const Simulator service{"small-server.xml"};
+    EXPECT_EQ(withoutOutput("record --for 0 saved.rec").status, 0);
+    EXPECT_EQ(run({"tree", "--from", "saved.rec"}).status, 0);
 }
 
 TEST(Program, LoadsTheLibraryThatItIsTold) {

@@ -12,17 +12,26 @@
 namespace raidinfo {
 namespace {
 
-Failure failure() {
+Failure failure(int reason) {
     return {ExitStatus::outputFailed,
-            "cannot write the output: " + std::generic_category().message(errno)};
+            "cannot write the output: " + std::generic_category().message(reason)};
 }
 
-int copyOfStandardOutput() {
+std::optional<Descriptor> copyOfStandardOutput() {
     const int copy = fcntl(STDOUT_FILENO, F_DUPFD_CLOEXEC, STDERR_FILENO + 1);
-    if (copy < 0) {
-        throw failure();
+    return copy < 0 ? std::nullopt : std::optional<Descriptor>{std::in_place, copy, "no copy"};
+}
+
+/// The null device must not go with a Descriptor where it has got the number itself.
+void divertStandardOutput() {
+    const int null = open("/dev/null", O_WRONLY | O_CLOEXEC);
+    if (null == STDOUT_FILENO) {
+        return;
     }
-    return copy;
+    const Descriptor opened{null, "cannot open /dev/null"};
+    if (dup2(opened.get(), STDOUT_FILENO) < 0) {
+        throw failure(errno);
+    }
 }
 
 }  // namespace
@@ -31,16 +40,14 @@ bool isStandardOutput(const std::filesystem::path& file) {
     return file == "-" || file == "/dev/stdout";
 }
 
-Output::Output() : original{copyOfStandardOutput(), "standard output"} {
-    const Descriptor null{open("/dev/null", O_WRONLY | O_CLOEXEC), "cannot open /dev/null"};
-    if (dup2(null.get(), STDOUT_FILENO) < 0) {
-        throw failure();
-    }
-}
+Output::Output() : original{copyOfStandardOutput()} { divertStandardOutput(); }
 
 void Output::write(std::string_view text) const {
-    if (!writeAll(original.get(), text)) {
-        throw failure();
+    if (!original) {
+        throw failure(EBADF);
+    }
+    if (!writeAll(original->get(), text)) {
+        throw failure(errno);
     }
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <filesystem>
+#include <optional>
 #include <string_view>
 
 #include "system/descriptor.h"
@@ -13,6 +14,7 @@ namespace raidinfo {
 
 /// The program's standard output, kept clean: the library prints a line per exchange on descriptor
 /// 1, so that one is pointed at the null device and the program writes to a copy of the original.
+/// That it is closed is told when something is to be written.
 class Output {
 public:
     Output();
@@ -20,10 +22,11 @@ public:
     /// Writes all of the text, or fails with the reason.
     void write(std::string_view text) const;
 
-    [[nodiscard]] int descriptor() const noexcept { return original.get(); }
+    /// Negative where there is none.
+    [[nodiscard]] int descriptor() const noexcept { return original ? original->get() : -1; }
 
 private:
-    Descriptor original;
+    std::optional<Descriptor> original;
 };
 
 }  // namespace raidinfo
