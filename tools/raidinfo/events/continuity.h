@@ -21,7 +21,7 @@ struct MissingNumbers {
 
 /// The last event of an earlier run: its number and, if it is known, what identifies its content.
 struct LastShown {
-    std::int64_t number;
+    std::int64_t number = 0;
     std::optional<std::uint64_t> content = std::nullopt;
     bool operator==(const LastShown&) const = default;
 };
