@@ -63,31 +63,44 @@ int runInLibrary(const Options& options, const Output& output) {
     return signal ? signalExitBase + *signal : status;
 }
 
-/// A monitoring system takes any other status for that of a plugin that is broken.
-int tellMonitoring(const Failure& failure, const Output& output) {
-    const health::Verdict unknown = health::unknownBecause(failure.what());
-    output.write(health::nagiosLine(unknown));
-    return health::exitStatus(unknown);
+/// The failure in the form that was asked for; "" where its line is all.
+std::string inForm(const Failure& failure, const Source& source, bool asJson, bool forMonitoring) {
+    if (forMonitoring) {
+        return health::nagiosLine(health::unknownBecause(failure.what()));
+    }
+    return asJson ? documentLine(enveloped(
+                        source, {{troubleCode(failure.status()), failure.what()}}, nullptr))
+                  : "";
 }
 
-/// Tells of a failure, and returns the exit status that it has in this subcommand.
-int fail(const Failure& failure, const Options& options, const Output& output) {
+/// Tells of a failure. That it cannot be told on the standard output, too, changes nothing.
+void tell(const Failure& failure, const std::string& form, const Output& output) {
     complain(failure.what());
-    const bool canWrite = failure.status() != ExitStatus::outputFailed;
-    if (options.json && canWrite) {
-        output.write(documentLine(enveloped(
-            sourceOf(options), {{troubleCode(failure.status()), failure.what()}}, nullptr)));
+    try {
+        output.write(form);
+    } catch (const Failure&) {  // NOLINT(bugprone-empty-catch)
+        // The one line on standard error says what matters.
     }
-    if (std::holds_alternative<DiffOptions>(options.command)) {
-        constexpr int trouble = 2;
-        return trouble;
-    }
-    if (const auto* const health = std::get_if<HealthOptions>(&options.command)) {
-        return health->nagios && canWrite
-                   ? tellMonitoring(failure, output)
-                   : health::exitStatus(health::unknownBecause(failure.what()));
-    }
-    return static_cast<int>(failure.status());
+}
+
+/// The exit status that a failure has in this subcommand.
+int statusOf(const Failure& failure, const CommandOptions& command) {
+    constexpr int troubleOfDiff = 2;
+    return std::visit(
+        Overloaded{[](const DiffOptions&) { return troubleOfDiff; },
+                   [&](const HealthOptions&) {
+                       return health::exitStatus(health::unknownBecause(failure.what()));
+                   },
+                   [&](const auto&) { return static_cast<int>(failure.status()); }},
+        command);
+}
+
+int fail(const Failure& failure, const Options& options, const Output& output) {
+    const auto* const health = std::get_if<HealthOptions>(&options.command);
+    tell(failure,
+         inForm(failure, sourceOf(options), options.json, health != nullptr && health->nagios),
+         output);
+    return statusOf(failure, options.command);
 }
 
 int run(const Options& options, const Output& output) {
@@ -111,15 +124,10 @@ int refuse(const Failure& failure, std::span<const char* const> arguments, const
             return argument == word || (argument.starts_with(word) && argument[word.size()] == '=');
         });
     };
-    complain(failure.what());
-    if (isThere("health") && isThere("--nagios")) {
-        return tellMonitoring(failure, output);
-    }
-    if (isThere("--json")) {
-        output.write(documentLine(
-            enveloped({"none", ""}, {{troubleCode(failure.status()), failure.what()}}, nullptr)));
-    }
-    return static_cast<int>(failure.status());
+    const bool forMonitoring = isThere("health") && isThere("--nagios");
+    tell(failure, inForm(failure, {"none", ""}, isThere("--json"), forMonitoring), output);
+    // A monitoring system takes any other status for that of a plugin that is broken.
+    return forMonitoring ? statusOf(failure, HealthOptions{}) : static_cast<int>(failure.status());
 }
 
 }  // namespace

@@ -212,6 +212,18 @@ TEST(FailingProgram, SaysThatItHasNoStandardOutput) {
     }
 }
 
+TEST(FailingProgram, KeepsTheStatusOfAFailureThatItCannotTellOnStandardOutput) {
+    for (const auto& [arguments, status] : {std::pair{"tree --json", 69},
+                                            {"diff nowhere.json --json", 2},
+                                            {"health --json", 3},
+                                            {"health --nagios", 3},
+                                            {"list nothing --json", 64}}) {
+        const Result result = withoutOutput(arguments);
+        EXPECT_EQ(result.status, status) << arguments;
+        EXPECT_THAT(result.errors, MatchesRegex("raidinfo: [^\n]*\n")) << arguments;
+    }
+}
+
 TEST(FailingProgram, NeedsNoStandardOutputToWriteAFile) {
     const Simulator service{"small-server.xml"};
     EXPECT_EQ(withoutOutput("record --for 0 saved.rec").status, 0);

@@ -13,6 +13,7 @@
 #include "scripted.h"
 #include "simulator.h"
 #include "support/files.h"
+#include "unread_terminal.h"
 
 namespace raidinfo::test {
 namespace {
@@ -168,6 +169,15 @@ TEST(WatchCommand, FollowsTheSizeOfTheTerminal) {
     watch.waitForOutput("Logical drive 1");
     watch.send("\x03");
     EXPECT_EQ(watch.finish().status, 130);
+}
+
+TEST(WatchCommand, IsInterruptedAlsoWhenTheTerminalTakesNoPictureOfItsNewSize) {
+    const Simulator simulator{"small-server.xml"};
+    UnreadTerminal terminal;
+    terminal.waitFor("Logical drive 1");
+    terminal.fill();
+    terminal.resizeUntilFull();
+    EXPECT_EQ(terminal.interrupted(), 130);
 }
 
 // A shell with job control, for without one nobody could continue it.

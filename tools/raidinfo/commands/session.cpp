@@ -46,11 +46,11 @@ Trees Session::inventory() const {
         }
         return trees;
     }
-    const Alarm alarm{chosen.limit, lib.function<void()>("cancelGetEvent")};
+    const Alarm alarm{chosen.limit, lib.function<void()>("cancelGetEvent"), stopToken};
     try {
         return Trees{readInventory(lib, alarm.over())};
     } catch (const Failure&) {
-        if (alarm.over().stop_requested()) {
+        if (alarm.rang()) {
             throw noAnswerInTime();
         }
         throw;

@@ -52,23 +52,35 @@ public:
 private:
     /// Reads and shows the inventory; what is shown stays where the service does not answer.
     bool look() {
-        const Alarm alarm{everShown ? std::nullopt : session.options().limit,
-                          session.library().function<void()>("cancelGetEvent")};
-        const std::stop_token over = alarm.over();
-        if (askNewest() == 0) {
-            return lost(over.stop_requested() ? noAnswerInTime() : serviceUnavailable());
-        }
-        const int seen = *newest;
+        std::optional<Trees> trees;
         try {
-            const Trees trees = Trees{readInventory(session.library(), over)};
-            if (session.stop().stop_requested()) {
-                return true;
-            }
-            newestSeen = seen;
-            show(trees);
-            return true;
+            trees.emplace(readNow());
         } catch (const Failure& failure) {
-            return lost(over.stop_requested() ? noAnswerInTime() : failure);
+            return lost(failure);
+        }
+        if (!session.stop().stop_requested()) {
+            show(*trees);
+        }
+        return true;
+    }
+
+    /// Waits as long as the options say, but only for the first answer.
+    Trees readNow() {
+        const Alarm alarm{everShown ? std::nullopt : session.options().limit,
+                          session.library().function<void()>("cancelGetEvent"), session.stop()};
+        try {
+            if (askNewest() == 0) {
+                throw serviceUnavailable();
+            }
+            const int seen = *newest;
+            Trees trees{readInventory(session.library(), alarm.over())};
+            newestSeen = seen;
+            return trees;
+        } catch (const Failure&) {
+            if (alarm.rang()) {
+                throw noAnswerInTime();
+            }
+            throw;
         }
     }
 

@@ -1,7 +1,6 @@
 #include "source/service.h"
 
 #include "source/service_failures.h"
-#include "system/cancellable.h"
 
 namespace raidinfo {
 
@@ -13,7 +12,7 @@ Inventory readInventory(const Library& library, const std::stop_token& stop) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
     const auto read = library.function<int()>("RAIDinit");
     read();
-    if (*system == nullptr && !stop.stop_requested() && !isCancelled()) {
+    if (*system == nullptr && !stop.stop_requested()) {
         if (library.function<int()>("enableRAIDEvent")() == 0) {
             throw serviceUnavailable();
         }

@@ -1,6 +1,5 @@
 #include "system/alarm.h"
 
-#include <stop_token>
 #include <utility>
 
 #include "system/backoff.h"
@@ -8,20 +7,23 @@
 
 namespace raidinfo {
 
-Alarm::Alarm(std::optional<std::chrono::milliseconds> after, std::function<void()> cancel) {
+Alarm::Alarm(std::optional<std::chrono::milliseconds> after, std::function<void()> cancel,
+             const std::stop_token& stop)
+    : stopped{stop, [this] { end.request_stop(); }} {
     if (!after) {
         return;
     }
-    clock = std::jthread{[time = *after, cancel = std::move(cancel), waiting = pthread_self(),
-                          source = timeIsOver](const std::stop_token& stop) mutable {
-        pauseUnlessStopped(time, stop);
-        if (!stop.stop_requested()) {
-            source.request_stop();
+    clock = std::jthread{[this, time = *after, cancel = std::move(cancel),
+                          waiting = pthread_self()](const std::stop_token& ended) {
+        pauseUnlessStopped(time, ended);
+        if (!ended.stop_requested()) {
+            timeIsOver = true;
+            end.request_stop();
         }
-        while (!stop.stop_requested()) {
+        while (!ended.stop_requested()) {
             cancel();
             wake(waiting);
-            pauseUnlessStopped(cancelInterval, stop);
+            pauseUnlessStopped(cancelInterval, ended);
         }
     }};
 }

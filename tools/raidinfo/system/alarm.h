@@ -1,5 +1,6 @@
 #pragma once
 
+#include <atomic>
 #include <chrono>
 #include <functional>
 #include <optional>
@@ -13,14 +14,23 @@ namespace raidinfo {
 /// never does.
 class Alarm {
 public:
-    Alarm(std::optional<std::chrono::milliseconds> after, std::function<void()> cancel);
+    Alarm(std::optional<std::chrono::milliseconds> after, std::function<void()> cancel,
+          const std::stop_token& stop = {});
+    Alarm(const Alarm&) = delete;
+    Alarm& operator=(const Alarm&) = delete;
+    ~Alarm() = default;
 
-    /// Requested to stop once the time is over.
-    [[nodiscard]] std::stop_token over() const { return timeIsOver.get_token(); }
+    /// Requested to stop once the time is over, or when `stop` is.
+    [[nodiscard]] std::stop_token over() const { return end.get_token(); }
+
+    /// Whether the time is over.
+    [[nodiscard]] bool rang() const noexcept { return timeIsOver; }
 
 private:
-    std::stop_source timeIsOver;
-    std::jthread clock;
+    std::stop_source end;
+    std::stop_callback<std::function<void()>> stopped;
+    std::atomic<bool> timeIsOver = false;
+    std::jthread clock;  ///< the last member: it uses the others
 };
 
 }  // namespace raidinfo

@@ -22,9 +22,9 @@ void wake(pthread_t thread);
 [[nodiscard]] bool isCancelled() noexcept;
 
 /// Runs work that blocks in the library on a thread of its own, and ends it early on SIGINT,
-/// SIGTERM, SIGHUP or SIGQUIT. SIGTSTP stops the program when the guest of its
-/// terminal has left that, which SIGWINCH has it redraw. Make it before the first other thread: it
-/// blocks all these signals.
+/// SIGTERM, SIGHUP or SIGQUIT. SIGTSTP stops the program when the guest of its terminal has left
+/// that, which SIGWINCH has it redraw. Make it before the first other thread: it blocks all these
+/// signals.
 class CancellableRun {
 public:
     CancellableRun();

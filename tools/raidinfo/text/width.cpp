@@ -79,11 +79,10 @@ std::string shortened(std::string_view printable, std::size_t columns) {
 std::vector<std::string> folded(std::string_view beginning, std::string_view printable,
                                 std::size_t columns) {
     std::vector<std::string> lines;
-    std::string start{beginning};
-    std::size_t taken = displayWidth(beginning);
-    const std::string indentation(std::min(taken, columns / 2), ' ');
+    std::string start = shortened(beginning, columns / 2);
+    const std::string indentation(displayWidth(start), ' ');
     do {
-        const std::size_t room = columns > taken ? columns - taken : 0;
+        const std::size_t room = columns - indentation.size();
         std::size_t end = bytesIn(printable, room);
         if (end == 0 && !printable.empty()) {
             end = firstCodePoint(printable).length;  // Without any room, too, it comes to an end.
@@ -92,10 +91,10 @@ std::vector<std::string> folded(std::string_view beginning, std::string_view pri
             end < printable.size() && space != std::string_view::npos && space > 0) {
             end = space;
         }
-        lines.push_back(start + std::string{printable.substr(0, end)});
+        const std::string_view part = printable.substr(0, end);
+        lines.push_back(start + std::string{part.substr(0, part.find_last_not_of(' ') + 1)});
         printable.remove_prefix(std::min(printable.find_first_not_of(' ', end), printable.size()));
         start = indentation;
-        taken = indentation.size();
     } while (!printable.empty());
     return lines;
 }

@@ -14,7 +14,8 @@ namespace raidinfo {
 [[nodiscard]] std::string shortened(std::string_view printable, std::size_t columns);
 
 /// The text on as many lines as it takes, cut at its spaces where that can be. The first line
-/// begins with this beginning, the others are indented by its width, at most by half the columns.
+/// begins with this beginning, which is shortened to half of the columns, the others are indented
+/// as far.
 [[nodiscard]] std::vector<std::string> folded(std::string_view beginning,
                                               std::string_view printable, std::size_t columns);
 

@@ -26,8 +26,8 @@ struct Picture {
 [[nodiscard]] std::vector<PictureLine> wholePicture(const Picture& picture);
 
 /// As many lines as there are rows, at most. What stands above and below the tree matters more than
-/// the tree, and in that what changed, which is shown in full if there are rows, more than what it
-/// belongs to, and that more than the rest. The lines of the tree that find no room are counted.
+/// the tree, and in that what changed, which is shown in full where there are rows, more than what
+/// it belongs to, and that more than the rest. The lines of the tree that find no room are counted.
 [[nodiscard]] std::vector<PictureLine> fittedPicture(const Picture& picture, std::size_t columns,
                                                      std::size_t rows);
 

@@ -1,8 +1,10 @@
 #include "watch/screen.h"
 
+#include <fcntl.h>
 #include <poll.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <exception>
 #include <string>
 #include <utility>
@@ -16,12 +18,25 @@ constexpr auto home = "\x1b[H";
 constexpr auto restOfLine = "\x1b[K";
 constexpr auto restOfScreen = "\x1b[J";
 
+/// Whoever draws for longer waits for a terminal that takes nothing.
+constexpr std::chrono::milliseconds longestDrawing{100};
+
+/// The same terminal, but who writes there does not wait for it. Nothing where it is another
+/// user's.
+std::optional<Descriptor> openedImpatiently(int terminal) {
+    const std::string name = "/proc/self/fd/" + std::to_string(terminal);
+    const int opened = open(name.c_str(), O_WRONLY | O_NONBLOCK | O_NOCTTY | O_CLOEXEC);
+    return opened < 0 ? std::nullopt
+                      : std::optional<Descriptor>{std::in_place, opened, "cannot open a terminal"};
+}
+
 }  // namespace
 
 Screen::Screen(const Output& destination, ColorChoice choice)
     : output{destination},
       colors{choice},
-      inPlace{terminalOf(destination.descriptor(), choice).cursorMoves} {
+      inPlace{terminalOf(destination.descriptor(), choice).cursorMoves},
+      impatient{inPlace ? openedImpatiently(destination.descriptor()) : std::nullopt} {
     if (inPlace) {
         guest.emplace(TerminalActs{.leave = [this] { leave(); },
                                    .enter = [this] { enter(); },
@@ -35,76 +50,75 @@ Screen::~Screen() {
     if (inPlace) {
         const std::scoped_lock lock{drawing};
         inPlace = false;
-        write(leaveSequence);
+        try {
+            output.write(leaveSequence);
+        } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
+            // A terminal that is gone needs no tidying.
+        }
     }
 }
 
-void Screen::write(std::string_view text) const noexcept {
-    try {
-        output.write(text);
-    } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
-        // A terminal that is gone needs no tidying.
+void Screen::show(Picture picture) {
+    {
+        const std::scoped_lock lock{drawing};
+        const bool isFirst = !shown;
+        shown = std::move(picture);
+        if (!inPlace) {
+            output.write((isFirst ? "" : "\n") + drawnBelow());
+        } else if (!isAway) {
+            output.write(drawnInPlace());
+        }
+    }
+    while (isStale.exchange(false)) {
+        const std::scoped_lock lock{drawing};
+        if (!isAway) {
+            output.write(drawnInPlace());
+        }
+    }
+}
+
+void Screen::writeAtOnce(std::string_view text) const noexcept {
+    pollfd terminal{impatient ? impatient->get() : output.descriptor(), POLLOUT, 0};
+    if (poll(&terminal, 1, 0) > 0) {
+        [[maybe_unused]] const ssize_t written = ::write(terminal.fd, text.data(), text.size());
     }
 }
 
 void Screen::leave() noexcept {
-    const std::scoped_lock lock{drawing};
+    const std::unique_lock lock{drawing, longestDrawing};
+    isAway = true;
     if (inPlace) {
-        isAway = true;
-        write(leaveSequence);
+        writeAtOnce(leaveSequence);
     }
 }
 
 void Screen::enter() noexcept {
     {
-        const std::scoped_lock lock{drawing};
+        const std::unique_lock lock{drawing, longestDrawing};
+        isAway = false;
         if (inPlace) {
-            isAway = false;
-            write(enterSequence);
+            writeAtOnce(enterSequence);
         }
     }
     redraw();
 }
 
-/// On the thread that watches for signals, which must not wait for a terminal that takes nothing.
 void Screen::redraw() noexcept {
+    isStale = true;  // Whoever draws now looks for it afterwards.
     const std::unique_lock lock{drawing, std::try_to_lock};
-    if (!lock) {
-        isStale = true;
-        return;
-    }
-    pollfd terminal{output.descriptor(), POLLOUT, 0};
-    if (inPlace && !isAway && shown && poll(&terminal, 1, 0) > 0) {
+    // A picture is longer than what a terminal is sure to take at once.
+    if (lock && inPlace && !isAway && shown && impatient) {
+        isStale = false;
         try {
-            output.write(drawnInPlace());
+            writeAtOnce(drawnInPlace());
         } catch (const std::exception&) {  // NOLINT(bugprone-empty-catch)
-            // The next picture fails where it can be told.
+            // There is no memory; the next picture fails where it can be told.
         }
     }
 }
 
-/// Takes no lock, for the thread that has it may hang; nor does it wait for the terminal.
-void Screen::abandon() const noexcept {
-    pollfd terminal{output.descriptor(), POLLOUT, 0};
-    if (poll(&terminal, 1, 0) > 0) {
-        [[maybe_unused]] const ssize_t written =
-            ::write(terminal.fd, leaveSequence.data(), leaveSequence.size());
-    }
-}
-
-void Screen::show(Picture picture) {
-    const std::scoped_lock lock{drawing};
-    const bool isFirst = !shown;
-    shown = std::move(picture);
-    if (!inPlace) {
-        output.write((isFirst ? "" : "\n") + drawnBelow());
-    } else if (!isAway) {
-        do {
-            isStale = false;
-            output.write(drawnInPlace());
-        } while (isStale);
-    }
-}
+/// Takes no lock, for the thread that has it may hang.
+void Screen::abandon() const noexcept { writeAtOnce(leaveSequence); }
 
 std::string Screen::drawnInPlace() const {
     const Terminal terminal = terminalOf(output.descriptor(), colors);

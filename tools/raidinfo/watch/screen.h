@@ -7,6 +7,7 @@
 #include <string_view>
 
 #include "presentation/terminal.h"
+#include "system/descriptor.h"
 #include "system/output.h"
 #include "system/terminal_guest.h"
 #include "watch/picture.h"
@@ -29,19 +30,24 @@ private:
     [[nodiscard]] std::string drawnInPlace() const;
     [[nodiscard]] std::string drawnBelow() const;
 
-    void write(std::string_view text) const noexcept;
+    // The acts of the thread that watches for signals: they wait neither for the terminal nor, for
+    // longer than it takes to draw, for the thread that draws.
     void redraw() noexcept;
     void leave() noexcept;
     void enter() noexcept;
     void abandon() const noexcept;
 
+    /// As much as the terminal takes.
+    void writeAtOnce(std::string_view text) const noexcept;
+
     const Output& output;
     ColorChoice colors;
     bool inPlace;
-    std::mutex drawing;  ///< the program may be stopped, or the terminal change, while it draws
+    std::optional<Descriptor> impatient;  ///< for who may not wait for the terminal
+    std::timed_mutex drawing;
     std::optional<Picture> shown;
     std::atomic<bool> isStale = false;   ///< the terminal changed while it was drawn
-    bool isAway = false;                 ///< stopped, or about to be
+    std::atomic<bool> isAway = false;    ///< stopped, or about to be
     std::optional<TerminalGuest> guest;  ///< while there is a screen of its own
 };
 

@@ -37,7 +37,7 @@ TEST(ShortenedText, CutsBetweenCharacters) {
 TEST(Folded, BreaksAtSpacesAndIndents) {
     EXPECT_THAT(folded("* ", "one two three", 7), ElementsAre("* one", "  two", "  three"));
     EXPECT_THAT(folded("* ", "one two", 80), ElementsAre("* one two"));
-    EXPECT_THAT(folded("└─ ", "one  two", 6), ElementsAre("└─ one", "   two"));
+    EXPECT_THAT(folded("└─ ", "one  two", 7), ElementsAre("└─ one", "   two"));
 }
 
 TEST(Folded, BreaksAWordThatIsTooLong) {
@@ -46,7 +46,7 @@ TEST(Folded, BreaksAWordThatIsTooLong) {
 }
 
 TEST(Folded, ComesToAnEndWithoutRoom) {
-    EXPECT_THAT(folded("12345", "ab", 4), ElementsAre("12345a", "  b"));
+    EXPECT_THAT(folded("12345", "abc", 4), ElementsAre("1…ab", "  c"));
     EXPECT_THAT(folded("", "ab", 0), ElementsAre("a", "b"));
     EXPECT_THAT(folded("", "", 0), ElementsAre(""));
 }

@@ -3,6 +3,8 @@
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
 
+#include "text/width.h"
+
 namespace raidinfo {
 namespace {
 
@@ -57,6 +59,15 @@ TEST(Picture, ShowsALineThatChangedInFullAndCutsTheOthers) {
     EXPECT_THAT(fitted({{}, {changed, same}, {{"an event that is longer"}}}, 20, 9),
                 ElementsAre("* └─ drive:", "     Critical, state", "     3 (failed)",
                             "  └─ drive: Critica…", "an event that is lo…"));
+}
+
+TEST(Picture, HasNoLineThatIsWiderThanTheTerminal) {
+    const TreeLine deep{"/A", "│  │  │  └─ ", "Fan 0: status 2 (failed)", Change::changed};
+    for (std::size_t columns = 1; columns < 40; ++columns) {
+        for (const PictureLine& shown : fittedPicture({{{"a heading"}}, {deep}, {}}, columns, 40)) {
+            EXPECT_LE(displayWidth(shown.text), columns) << shown.text;
+        }
+    }
 }
 
 TEST(Picture, MarksWhatIsGone) {
