@@ -279,6 +279,19 @@ TEST(EventsCommand, ShowsAnotherEventThatUsesTheLastNumberWhileItWaits) {
     EXPECT_THAT(numbers(program.finish().output), ElementsAre(45, 45, 46));
 }
 
+TEST(EventsCommand, NoticesInTheMidstOfAWaitThatTheNumbersRepeatOrGoBack) {
+    Simulator simulator{"small-server.xml"};
+    simulator.command("event sequenceNumber=1000");
+    Program program{raidinfo({"events", "--json", "--since", "1000", "--interval", "1"})};
+    program.waitForOutput("\n");
+    simulator.command("event place=last sequenceNumber=1000 string=another");
+    program.waitForOutput("another");
+    simulator.command("event place=last sequenceNumber=50 string=lower");
+    EXPECT_THAT(numbers(program.waitForOutput("lower")), ElementsAre(1000, 1000, 50));
+    program.signal(SIGINT);
+    EXPECT_THAT(program.finish().errors, HasSubstr("begun to count anew"));
+}
+
 TEST(EventsCommand, TellsAGapBeforeTheEventBehindIt) {
     const ScriptedService service{{newest(9), awaited(), answering(eventBatch({5, 7, 9}))}};
     const Result result = run({"events", "--json", "--since", "5", "--count", "2"});

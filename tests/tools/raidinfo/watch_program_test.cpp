@@ -81,20 +81,37 @@ TEST(WatchCommand, TellsOfAnAdapterThatComesAndGoes) {
     EXPECT_EQ(watch.finish().status, 130);
 }
 
-// The wait for an event after 4 ends at once, for there is 50.
+// Each wait for an event after 4 ends at once, for there is 50.
 TEST(WatchCommand, GoesOnAfterItsPauseWhereTheNumbersAreInDisorder) {
     const Connection configured = answering(configuration(sampleAdapter()));
     const Connection four = answering(newestEventDocument("4"));
     const Connection awaited = answering("the answer to the wait is not looked at");
     const Connection events = answering(eventBatch({50, 4}));
-    const ScriptedService service{{four, configured, awaited, events, four, configured, awaited,
-                                   events, four, configured, awaited, events}};
-    Program watch{raidinfo({"watch", "--interval", "3600", "--json"})};
-    service.waitFor(11, Stage::answered);
+    const Connection silent{.end = End::hold};
+    const ScriptedService service{{four, configured, awaited, awaited, events, four, configured,
+                                   awaited, awaited, events, four, configured, awaited, awaited,
+                                   events, four, silent}};
+    Program watch{raidinfo({"watch", "--interval", "1", "--json"})};
+    service.waitFor(16, Stage::answered);
     watch.signal(SIGINT);
     const Result result = watch.finish();
     EXPECT_EQ(result.status, 130);
-    EXPECT_THAT(result.output, Not(HasSubstr("service_unavailable"))) << "it has asked again";
+    EXPECT_THAT(result.output, Not(HasSubstr("service_unavailable")));
+}
+
+TEST(WatchCommand, TellsOfEventsWhoseNumbersRepeatOrGoBack) {
+    Simulator simulator{"small-server.xml"};
+    Program watch{raidinfo({"watch", "--interval", "1"})};
+    watch.waitForOutput("Logical drive 1");
+    simulator.command("event sequenceNumber=1000 string=first");
+    watch.waitForOutput("first");
+    simulator.command("event place=last sequenceNumber=1000 string=second\nevent string=third");
+    watch.waitForOutput("third");
+    EXPECT_THAT(watch.waitForOutput("third"), HasSubstr("second"));
+    simulator.command("event place=last sequenceNumber=50 string=lower");
+    watch.waitForOutput("lower");
+    watch.signal(SIGINT);
+    EXPECT_EQ(watch.finish().status, 130);
 }
 
 TEST(WatchCommand, WritesADocumentForEachChange) {

@@ -37,6 +37,7 @@ struct EventsOptions {
     std::optional<int> count = std::nullopt;  ///< how many to show
     std::string command = {};                 ///< run for each event
     std::optional<Path> state = std::nullopt;
+    std::chrono::seconds interval{30};
 };
 
 struct WatchOptions {

@@ -110,11 +110,16 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          addFile(app, "--state", words.state,
                  "Keep the last number in this file, and go on from there when started again, "
                  "whatever --since says");
+         addNumber(app, "--interval", words.eventsInterval,
+                   "Look so often whether the service counts anew, even if nothing comes",
+                   "SECONDS", {1, longestSeconds})
+             ->default_val(EventsOptions{}.interval.count());
      },
      [](const CLI::App& app, const Words& words) -> CommandOptions {
          return EventsOptions{optionalNumber(app, "--since", words.since),
                               optionalNumber(app, "--count", words.count), words.command,
-                              optionalPath(words.state)};
+                              optionalPath(words.state),
+                              std::chrono::seconds{words.eventsInterval}};
      }},
     {"watch", "Show the tree again whenever something happens",
      "What changed is marked with \"*\". Ctrl-C ends it.\n"

@@ -28,6 +28,7 @@ struct Words {
     int count = 0;
     std::string command;
     std::string state;
+    int eventsInterval = 0;
     int interval = 0;
     bool explain = false;
     bool nagios = false;

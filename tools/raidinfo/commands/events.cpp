@@ -86,7 +86,7 @@ private:
 /// What cannot be kept is told before the first event is handed to anybody.
 StreamStart startOf(const EventsOptions& options,
                     std::optional<std::chrono::milliseconds> patience) {
-    StreamStart start{.first = options.since, .patience = patience};
+    StreamStart start{.first = options.since, .patience = patience, .interval = options.interval};
     if (options.state) {
         const StateFile state{*options.state};
         start.shownBefore = state.read();

@@ -11,6 +11,7 @@
 #include "exit_status.h"
 #include "json/json.h"
 #include "presentation/tree.h"
+#include "source/exchange.h"
 #include "source/service.h"
 #include "source/service_failures.h"
 #include "system/alarm.h"
@@ -32,6 +33,7 @@ public:
           options{chosen},
           askNewest{watched.library().function<int()>("enableRAIDEvent")},
           newest{watched.library().variable<int>("nextSequenceNumber")},
+          service{watched.library()},
           wait{watched.library()} {
         if (!watched.options().json) {
             screen.emplace(watched.output(), watched.options().color);
@@ -157,12 +159,17 @@ private:
 
     /// Until something happens or the interval is over.
     void waitForEvents() {
+        if (session.stop().stop_requested()) {
+            return;
+        }
         bool isNew = false;
         bool inTime = false;
         {
             const Alarm alarm{options.interval,
                               session.library().function<void()>("cancelGetEvent")};
-            isNew = events.take(wait.from(events.awaited(newestSeen)).events, newestSeen);
+            const std::int64_t awaited = events.awaited(newestSeen);
+            isNew = service.nextEvent(awaited - 1) &&
+                    events.take(wait.from(events.readFrom(awaited)).events, newestSeen);
             inTime = !alarm.over().stop_requested();
         }
         hasNewEvents = hasNewEvents || isNew;
@@ -182,6 +189,7 @@ private:
     std::optional<Screen> screen;  ///< none for JSON
     int (*askNewest)();
     const int* newest;
+    Exchange service;
     EventWait wait;
     Backoff backoff;
     std::vector<TreeLine> lines;

@@ -46,10 +46,7 @@ public:
         }
         const auto last = continuity->last();
         const bool wentBack = last && newest < *last && newest != trusted;
-        if (last && newest <= *last && !wentBack && !mayBeLate && !isNextThere()) {
-            if (!stop.stop_requested()) {
-                examineFailure(Awaited::Outcome::failed, stop);
-            }
+        if (last && newest <= *last && !wentBack && !mayBeLate && !awaitNext(stop)) {
             return true;
         }
         const std::int64_t from = wentBack ? newest : continuity->overlapping();
@@ -133,8 +130,17 @@ private:
     /// Waits for an event behind the last one shown. The library's own wait would be followed by
     /// the events from the same number on, so that an event which used the last number once more
     /// meanwhile would be missed.
-    [[nodiscard]] bool isNextThere() const {
-        return service.nextEvent(continuity->next() - 1).has_value();
+    [[nodiscard]] bool awaitNext(const std::stop_token& stop) {
+        const Alarm alarm{beginning.interval, cancel, stop};
+        if (service.nextEvent(continuity->next() - 1)) {
+            return true;
+        }
+        if (alarm.rang()) {
+            mayBeLate = true;
+        } else if (!stop.stop_requested()) {
+            examineFailure(Awaited::Outcome::failed, stop);
+        }
+        return false;
     }
 
     /// Looks whether the service still tells of the events that were shown; if not, it has begun to

@@ -37,6 +37,9 @@ struct StreamStart {
     std::optional<std::int64_t> first = std::nullopt;
     std::optional<LastShown> shownBefore = std::nullopt;
     std::optional<std::chrono::milliseconds> patience = std::nullopt;  ///< for the first answer
+    /// After so long a wait the service is asked whether it has begun to count anew, or has used
+    /// its last number once more: neither ends the wait.
+    std::chrono::milliseconds interval{};
 };
 
 /// Shows every event once until stop is requested or the listener has seen enough. A service that

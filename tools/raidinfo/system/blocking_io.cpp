@@ -12,13 +12,17 @@ namespace raidinfo {
 namespace {
 
 /// Whether the call that has just failed is worth another attempt. The signals of a cancel come
-/// again and again, so that they alone do not keep it from what needs no wait.
+/// again and again, so that they alone do not keep it from what needs no wait. Who started the
+/// program may have left the file such that it does not wait by itself.
 bool mayGoOn(int file, short event) {
-    if (errno != EINTR) {
+    const int error = errno;
+    if (error != EINTR && error != EAGAIN) {
         return false;
     }
+    constexpr int untilReady = -1;
     pollfd watched{file, event, 0};
-    const bool goesOn = !isCancelled() || poll(&watched, 1, 0) > 0;
+    bool goesOn = poll(&watched, 1, error == EAGAIN && !isCancelled() ? untilReady : 0) > 0;
+    goesOn = goesOn || !isCancelled();
     errno = EINTR;
     return goesOn;
 }

@@ -20,13 +20,20 @@ const EventListener silent{[](const Record& /*event*/) { return true; },
 
 std::int64_t LatestEvents::awaited(std::int64_t newest) const {
     const std::int64_t next = newest + 1;
-    const bool isCounting = continuity && newest >= continuity->last().value_or(0);
-    if (!isCounting) {
+    if (!continuity) {
         return next;
+    }
+    if (newest < continuity->last().value_or(0)) {
+        return std::max<std::int64_t>(newest, 1);
     }
     // The newest must be among the numbers that the library asks for.
     return std::clamp<std::int64_t>(continuity->next(),
                                     std::max<std::int64_t>(next - numbersAsked, 1), next);
+}
+
+std::int64_t LatestEvents::readFrom(std::int64_t awaitedNumber) const {
+    const bool isRightBehind = continuity && continuity->last() == awaitedNumber - 1;
+    return isRightBehind ? awaitedNumber - 1 : awaitedNumber;
 }
 
 bool LatestEvents::take(const Records& batch, std::int64_t newest) {

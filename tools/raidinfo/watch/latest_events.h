@@ -13,8 +13,13 @@ namespace raidinfo {
 class LatestEvents {
 public:
     /// The number from which to wait for events where this is the service's newest one. What came
-    /// while the inventory was read is waited for, too.
+    /// while the inventory was read is waited for, too, and the newest itself where the numbers
+    /// went back.
     [[nodiscard]] std::int64_t awaited(std::int64_t newest) const;
+
+    /// The number from which to read once those are there: with the last one seen right before
+    /// them, since another event may use its number once more.
+    [[nodiscard]] std::int64_t readFrom(std::int64_t awaitedNumber) const;
 
     /// Keeps those that are new; returns whether there are any.
     bool take(const Records& batch, std::int64_t newest);

@@ -115,7 +115,8 @@ Lines fittedTree(const std::vector<TreeLine>& tree, std::size_t columns, std::si
         std::ranges::move(line, std::back_inserter(lines));
     }
     if (hidden > 0 && rows > 0) {
-        lines.push_back({std::to_string(hidden) + (hidden == 1 ? " more line" : " more lines")});
+        lines.push_back({shortened(
+            std::to_string(hidden) + (hidden == 1 ? " more line" : " more lines"), columns)});
     }
     return lines;
 }

@@ -102,6 +102,9 @@ TEST(ShowOptions, NameAKindAndAPosition) {
 
 TEST(EventsOptions, SayWhereToBeginAndWhenToEnd) {
     const auto plain = command<EventsOptions>({"events"});
+    EXPECT_EQ(plain.interval, std::chrono::seconds{30});
+    EXPECT_EQ(command<EventsOptions>({"events", "--interval", "7"}).interval,
+              std::chrono::seconds{7});
     EXPECT_EQ(plain.since, std::nullopt);
     EXPECT_EQ(plain.count, std::nullopt);
     EXPECT_EQ(plain.state, std::nullopt);

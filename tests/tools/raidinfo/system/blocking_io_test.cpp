@@ -1,5 +1,6 @@
 #include "system/blocking_io.h"
 
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <sys/socket.h>
 #include <unistd.h>
@@ -79,6 +80,35 @@ TEST(BlockingIo, FinishesWhatNeedsNoWaitAlsoWhenTheRunIsCancelled) {
     std::array<char, 32> room{};
     EXPECT_TRUE(written);
     EXPECT_EQ(readSome(pair.there->get(), room), 14);
+}
+
+TEST(BlockingIo, WaitsForAFileThatDoesNotWaitByItself) {
+    const Pair pair;
+    ASSERT_EQ(fcntl(pair.here->get(), F_SETFL, O_NONBLOCK), 0);
+    bool written = false;
+    std::size_t taken = 0;
+    std::jthread writer{[&] { written = writeAll(pair.here->get(), more); }};
+    std::array<char, 65536> room{};
+    while (taken < more.size()) {
+        const ssize_t size = readSome(pair.there->get(), room);
+        ASSERT_GT(size, 0);
+        taken += static_cast<std::size_t>(size);
+    }
+    writer.join();
+    EXPECT_TRUE(written);
+}
+
+TEST(BlockingIo, LeavesAFileThatDoesNotWaitByItselfWhenTheRunIsCancelled) {
+    const Pair pair;
+    ASSERT_EQ(fcntl(pair.here->get(), F_SETFL, O_NONBLOCK), 0);
+    bool written = true;
+    CancellableRun{}.run(
+        [&](const std::stop_token&) {
+            kill(getpid(), SIGTERM);
+            written = writeAll(pair.here->get(), more);
+        },
+        [] {});
+    EXPECT_FALSE(written);
 }
 
 TEST(BlockingIo, TellsOfADescriptorThatIsNotOpen) {

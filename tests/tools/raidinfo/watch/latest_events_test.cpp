@@ -41,10 +41,21 @@ TEST(LatestEvents, AreAwaitedSoThatTheNewestIsAmongTheNumbersThatTheLibraryReads
     EXPECT_EQ(events.awaited(1'000'000), 999'900);
 }
 
-TEST(LatestEvents, AreAwaitedBehindTheNewestWhereTheNumbersWentBack) {
+TEST(LatestEvents, AreAwaitedFromTheNewestOnWhereTheNumbersWentBack) {
     LatestEvents events;
     events.take(batch({42}), 41);
+    EXPECT_EQ(events.awaited(7), 7);
+    EXPECT_EQ(events.awaited(0), 1);
+    EXPECT_TRUE(events.take(batch({7}), 7));
     EXPECT_EQ(events.awaited(7), 8);
+}
+
+TEST(LatestEvents, AreReadWithTheOneRightBeforeThem) {
+    LatestEvents events;
+    EXPECT_EQ(events.readFrom(42), 42);
+    events.take(batch({42}), 41);
+    EXPECT_EQ(events.readFrom(43), 42);
+    EXPECT_EQ(events.readFrom(1'000), 1'000);
 }
 
 TEST(LatestEvents, AreTheLastThreeThatAreNew) {

@@ -64,8 +64,11 @@ TEST(Picture, ShowsALineThatChangedInFullAndCutsTheOthers) {
 TEST(Picture, HasNoLineThatIsWiderThanTheTerminal) {
     const TreeLine deep{"/A", "│  │  │  └─ ", "Fan 0: status 2 (failed)", Change::changed};
     for (std::size_t columns = 1; columns < 40; ++columns) {
-        for (const PictureLine& shown : fittedPicture({{{"a heading"}}, {deep}, {}}, columns, 40)) {
-            EXPECT_LE(displayWidth(shown.text), columns) << shown.text;
+        for (const std::size_t rows : {2U, 40U}) {
+            for (const PictureLine& shown :
+                 fittedPicture({{{"a heading"}}, {deep, deep}, {}}, columns, rows)) {
+                EXPECT_LE(displayWidth(shown.text), columns) << shown.text;
+            }
         }
     }
 }
