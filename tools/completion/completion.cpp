@@ -13,7 +13,8 @@ namespace {
 constexpr std::string_view beginning =
     R"(# Completes the command line of @PROGRAM@; made by "@PROGRAM@ completion".
 _@PROGRAM@() {
-    local words=() word command= operand= place=0 type= offered= files= prefix= current piece whole
+    local words=() listed=() word command= operand= place=0 type= offered= files=
+    local prefix= current piece whole
     # The words as the program gets them: bash cuts them at "=" and ":", too.
     for word in "${COMP_WORDS[@]:0:COMP_CWORD+1}"; do
         if ((${#words[@]} > 0)) && [[ $word == [=:]* || ${words[-1]} == *[=:] ]]; then
@@ -75,10 +76,12 @@ constexpr std::string_view ending = R"(    esac
 complete -F _@PROGRAM@ @PROGRAM@
 )";
 
+// Words are taken as they were typed, even those that would be patterns of files.
 constexpr std::string_view splitList =
     R"(            prefix=${current%"${current##*[,+]}"} current=${current##*[,+]}
-            for word in ${prefix//[,+]/ }; do
-                offered=" $offered " offered=${offered// $word / }
+            IFS=',+' read -ra listed <<<"$prefix"
+            for word in "${listed[@]}"; do
+                offered=" $offered " offered=${offered//" $word "/ }
             done
 )";
 

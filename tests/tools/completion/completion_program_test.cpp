@@ -72,6 +72,22 @@ TEST(CompletionOfRaidinfo, CompletesItsWords) {
         });
 }
 
+// "*" is the name of a column to nobody, but the shell takes it for these files, or for all
+// columns.
+TEST(CompletionOfRaidinfo, TakesAListForWhatIsTypedWhateverFilesThereAre) {
+    std::filesystem::create_directory("columns");
+    const std::filesystem::path before = std::filesystem::current_path();
+    std::filesystem::current_path("columns");
+    writeFile("index", "");
+    expectCompleted(RAIDINFO_PROGRAM,
+                    {
+                        {"raidinfo list fans -o '*,ind", "raidinfo list fans -o '*,index' "},
+                        {"raidinfo list fans -o 'i*,ind", "raidinfo list fans -o 'i*,index' "},
+                        {"raidinfo list fans -o index,ind", "raidinfo list fans -o index,ind"},
+                    });
+    std::filesystem::current_path(before);
+}
+
 TEST(CompletionOfRaidinfo, StartsAFilterThatGoesOn) {
     expectCompleted(RAIDINFO_PROGRAM,
                     {
