@@ -3,70 +3,113 @@
 #include <algorithm>
 #include <cstdint>
 #include <iterator>
+#include <limits>
+#include <optional>
+#include <set>
 #include <utility>
-
-#include "overloaded.h"
 
 namespace raidinfo::health {
 namespace {
 
-/// The operand and its neighbours, since whatever bounds it sets lie between these.
-std::vector<Value> around(const Value& operand) {
-    std::vector<Value> values{operand};
-    std::visit(Overloaded{[&values](int number) {
-                              for (const std::int64_t step : {-1, 1}) {
-                                  const std::int64_t next = number + step;
-                                  if (std::in_range<int>(next)) {
-                                      values.emplace_back(static_cast<int>(next));
-                                  }
-                              }
-                          },
-                          [&values](bool flag) { values.emplace_back(!flag); }, [](const auto&) {}},
-               operand);
-    return values;
-}
+/// The values of one field that fulfil the conditions so far. Each condition is looked at once, for
+/// a file may speak of a field ten thousand times.
+class Remainder {
+public:
+    void narrow(const Condition& condition) {
+        switch (condition.comparison) {
+            case Operator::is:
+            case Operator::in:
+                return keepOnly(condition.operands);
+            case Operator::isNot:
+            case Operator::notIn:
+                excluded.insert(condition.operands.begin(), condition.operands.end());
+                canBeUnknown = canBeUnknown && !condition.byName;
+                return;
+            case Operator::below:
+                return keepUpTo(boundOf(condition) - 1);
+            case Operator::above:
+                return keepFrom(boundOf(condition) + 1);
+            case Operator::atMost:
+                return keepUpTo(boundOf(condition));
+            case Operator::atLeast:
+                return keepFrom(boundOf(condition));
+            case Operator::known:
+                break;
+        }
+        const bool isKnown = std::get<bool>(condition.operands.front());
+        canBeKnown = canBeKnown && isKnown;
+        canBeUnknown = canBeUnknown && !isKnown;
+    }
 
-/// If any value fulfils the conditions on a field, one of these does.
-std::vector<Value> tellingValues(const std::vector<Condition>& conditions) {
-    std::vector<Value> values;
-    std::string other = "other than ";
-    bool isText = true;
-    for (const Condition& condition : conditions) {
-        if (condition.comparison == Operator::known) {
-            continue;
+    [[nodiscard]] bool isEmpty() const {
+        if (!canBeKnown && !canBeUnknown) {
+            return true;
         }
-        for (const Value& operand : condition.operands) {
-            std::ranges::move(around(operand), std::back_inserter(values));
-            const auto* const text = std::get_if<std::string>(&operand);
-            isText = text != nullptr;
-            other += isText ? *text : "";
+        if (among) {
+            return std::ranges::none_of(*among, [this](const Value& value) {
+                return isWithinBounds(value) && !excluded.contains(value);
+            });
         }
+        return std::ranges::count_if(excluded, [this](const Value& value) {
+                   return isWithinBounds(value);
+               }) >= valuesWithinBounds();
     }
-    if (isText) {
-        values.emplace_back(std::move(other));
+
+private:
+    static std::int64_t boundOf(const Condition& condition) {
+        return std::get<int>(condition.operands.front());
     }
-    return values;
-}
+
+    void keepUpTo(std::int64_t bound) { greatest = std::min(greatest, bound); }
+    void keepFrom(std::int64_t bound) { least = std::max(least, bound); }
+
+    void keepOnly(const std::vector<Value>& operands) {
+        std::set<Value> kept;
+        std::ranges::copy_if(
+            operands, std::inserter(kept, kept.end()),
+            [this](const Value& operand) { return !among || among->contains(operand); });
+        among = std::move(kept);
+    }
+
+    /// Only numbers are ever bounded.
+    [[nodiscard]] bool isWithinBounds(const Value& value) const {
+        const int* const number = std::get_if<int>(&value);
+        return number == nullptr || (least <= *number && *number <= greatest);
+    }
+
+    /// Texts, which are without end, count like numbers without bounds.
+    [[nodiscard]] std::int64_t valuesWithinBounds() const {
+        const bool areFlags = !excluded.empty() && std::holds_alternative<bool>(*excluded.begin());
+        return areFlags ? 2 : greatest - least + 1;
+    }
+
+    std::optional<std::set<Value>> among;
+    std::set<Value> excluded;
+    std::int64_t least = std::numeric_limits<int>::min();
+    std::int64_t greatest = std::numeric_limits<int>::max();
+    bool canBeKnown = true;
+    bool canBeUnknown = true;
+};
 
 bool canHold(const std::vector<Condition>& conditions) {
-    const bool lacksCodes = std::ranges::any_of(conditions, [](const Condition& condition) {
-        return condition.byName && condition.operands.empty();
-    });
-    const auto fulfils = [&conditions](const Value& value, bool isKnown) {
-        return std::ranges::all_of(conditions, [&](const Condition& condition) {
-            return holds(condition, value, isKnown);
-        });
-    };
-    return lacksCodes ||
-           std::ranges::any_of(tellingValues(conditions), [&fulfils](const Value& value) {
-               return fulfils(value, true) || fulfils(value, false);
-           });
+    Remainder remainder;
+    for (const Condition& condition : conditions) {
+        if (condition.byName && condition.operands.empty()) {
+            return true;
+        }
+        remainder.narrow(condition);
+    }
+    return !remainder.isEmpty();
 }
 
 }  // namespace
 
 std::string contradictionIn(const std::vector<Condition>& conditions) {
+    std::set<std::string> judged;
     for (const Condition& condition : conditions) {
+        if (!judged.insert(condition.field).second) {
+            continue;
+        }
         std::vector<Condition> ofField;
         std::ranges::copy_if(
             conditions, std::back_inserter(ofField),

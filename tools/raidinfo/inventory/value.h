@@ -1,5 +1,6 @@
 #pragma once
 
+#include <compare>
 #include <string>
 #include <string_view>
 #include <variant>
@@ -9,7 +10,7 @@ namespace raidinfo {
 
 /// What nobody knows: a status for which the library has no text, or what the tree does not tell.
 struct Unknown {
-    bool operator==(const Unknown&) const = default;
+    auto operator<=>(const Unknown&) const = default;
 };
 
 /// What people read and write for it, and for a code without a name.

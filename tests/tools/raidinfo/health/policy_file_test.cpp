@@ -211,6 +211,31 @@ INSTANTIATE_TEST_SUITE_P(
                     "{ field = \"index\", below = 3 }]",
                     "site.toml:3: the conditions exclude each other: index is above 2 and index is "
                     "below 3"},
+        WrongPolicy{"numbers_of_which_none_is_left",
+                    "[[rule]]\nname = \"fan-critical\"\n"
+                    "when = [{ field = \"index\", in = [3, 4, 5] }, "
+                    "{ field = \"fan_name\", not = \"a\" }, { field = \"index\", in = [5, 4] }, "
+                    "{ field = \"index\", not = 4 }, { field = \"index\", below = 5 }]",
+                    "site.toml:3: the conditions exclude each other: index is one of 3, 4, 5 and "
+                    "index is one of 5, 4 and index is not 4 and index is below 5"},
+        WrongPolicy{"neither_true_nor_false",
+                    wrongRule("severity = \"warning\"\nmessage = \"m\"\nkind = \"members\"\n"
+                              "when = [{ field = \"present\", not = true }, "
+                              "{ field = \"present\", not = false }]"),
+                    "site.toml:6: the conditions exclude each other: present is not true and "
+                    "present is not false"},
+        WrongPolicy{"number_beyond_the_greatest",
+                    "[[rule]]\nname = \"fan-critical\"\n"
+                    "when = [{ field = \"index\", above = 2147483647 }, "
+                    "{ field = \"index\", not = 0 }]",
+                    "site.toml:3: the conditions exclude each other: index is above 2147483647 and "
+                    "index is not 0"},
+        WrongPolicy{"name_of_what_is_unknown",
+                    "[[rule]]\nname = \"fan-critical\"\n"
+                    "when = [{ field = \"status\", not = \"normal\" }, "
+                    "{ field = \"status\", known = false }]",
+                    "site.toml:3: the conditions exclude each other: status is not normal and "
+                    "status is not known"},
         WrongPolicy{"count_below_nothing",
                     "[[rule]]\nname = \"hot-spare-missing\"\n"
                     "when = { field = \"ready_spares\", below = 0 }",
@@ -271,6 +296,20 @@ TEST(PolicyFile, MaySpeakSeveralTimesOfAField) {
             policyOf("[[rule]]\nname = \"fan-critical\"\nwhen = [" + std::string{conditions} + "]"))
             << conditions;
     }
+}
+
+// The longest file there may be, for whatever is in it must be judged while somebody waits.
+TEST(PolicyFile, MaySpeakOfAFieldAsOftenAsThereIsRoom) {
+    std::string conditions;
+    int number = 0;
+    while (conditions.size() < settings::longestDocument - 500) {
+        conditions += "{field=\"index\",not=" + std::to_string(number++) + "},";
+    }
+    const std::string rule = "[[rule]]\nname = \"fan-critical\"\nwhen = [" + conditions +
+                             "{ field = \"index\", at_least = 0 },";
+    const std::string upTo = "{ field = \"index\", at_most = ";
+    EXPECT_NO_THROW(policyOf(rule + upTo + std::to_string(number) + " }]"));
+    EXPECT_THROW(policyOf(rule + upTo + std::to_string(number - 1) + " }]"), Failure);
 }
 
 TEST(PolicyFile, MayDisableARuleThatSpeaksOfWhatTheCodeBookLacks) {
