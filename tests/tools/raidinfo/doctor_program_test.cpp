@@ -126,7 +126,7 @@ TEST(DoctorCommand, TellsMalformedEventsInTheReadersOwnWords) {
 
 TEST(DoctorCommand, LooksAtEverythingElseOfAServiceWithoutEvents) {
     const ScriptedService service{
-        {probe, otherPage, otherPage, answering(configuration(sampleAdapter())), otherPage}};
+        {probe, otherPage, answering(configuration(sampleAdapter())), otherPage}};
     const Result result = run({"doctor"});
     EXPECT_EQ(result.status, 76);
     const std::string said = " +bad +not an answer to the question: it begins with \"<html>";
@@ -134,14 +134,26 @@ TEST(DoctorCommand, LooksAtEverythingElseOfAServiceWithoutEvents) {
                                      ContainsRegex("Lists +ok"), ContainsRegex("Events" + said)));
 }
 
+// It asks for the newest number once, so that no event can come between two answers.
 TEST(DoctorCommand, TakesAServiceWithoutAnyEventForWell) {
-    const ScriptedService service{
-        {probe, answering(newestEventDocument("0")), answering(newestEventDocument("0")),
-         answering(configuration(sampleAdapter())), answering(eventBatch({}))}};
+    const ScriptedService service{{probe, answering(newestEventDocument("0")),
+                                   answering(configuration(sampleAdapter())),
+                                   answering(eventBatch({}))}};
     const Result result = run({"doctor"});
     EXPECT_EQ(result.status, 0);
     EXPECT_THAT(result.output, AllOf(ContainsRegex("Service answers +ok +its newest event is 0"),
                                      ContainsRegex("Events +ok")));
+}
+
+TEST(DoctorCommand, FindsANewestNumberBadThatHostsCannotUse) {
+    for (const std::string number : {"none", "", "-1"}) {
+        const ScriptedService service{{probe, answering(newestEventDocument(number)),
+                                       answering(configuration(sampleAdapter())),
+                                       answering(eventBatch({}))}};
+        const Result result = run({"doctor"});
+        EXPECT_EQ(result.status, 76) << number;
+        EXPECT_THAT(result.output, ContainsRegex("Service answers +bad +")) << number;
+    }
 }
 
 TEST(DoctorCommand, SaysThatTheQuestionForEventsGetsNoAnswer) {

@@ -51,18 +51,16 @@ Examined malformed(Examined found, const LibraryLog& log, const std::string& bod
     return found;
 }
 
-/// Whether it stands between two tags.
-bool hasNumber(std::string_view body, int number) {
-    const std::string expected = std::to_string(number);
+/// Whether the library, which makes 0 of an answer that it cannot read, too, has read it.
+bool hasZero(std::string_view body) {
     for (std::size_t tagEnd = body.find('>'); tagEnd != std::string_view::npos;
          tagEnd = body.find('>', tagEnd + 1)) {
-        const std::size_t begin = body.find_first_not_of(blanks, tagEnd + 1);
-        const std::string_view text =
-            body.substr(std::min(begin, body.size())).substr(0, expected.size());
-        const std::size_t behind =
-            body.find_first_not_of(blanks, std::min(begin, body.size()) + text.size());
-        if (text == expected && behind != std::string_view::npos && body[behind] == '<') {
-            return true;
+        const std::size_t text = body.find_first_not_of(blanks, tagEnd + 1);
+        if (text != std::string_view::npos && body[text] == '0') {
+            const std::size_t behind = body.find_first_not_of(blanks, text + 1);
+            if (behind != std::string_view::npos && body[behind] == '<') {
+                return true;
+            }
         }
     }
     return false;
@@ -70,24 +68,22 @@ bool hasNumber(std::string_view body, int number) {
 
 }  // namespace
 
+// It asks once: between two questions the number may change.
 Examined examinedNewestEvent(const Library& library, const std::stop_token& over) {
     Examined found{"answering", "Service answers", Outcome::fine, ""};
-    const auto* const none = "it accepts connections and gives no answer";
     const LibraryLog log{library};
-    if (library.function<int()>("enableRAIDEvent")() == 0) {
-        return withoutAnswer(found, over, none);
-    }
-    const int newest = *library.variable<int>("nextSequenceNumber");
-    found.finding = "its newest event is " + std::to_string(newest);
-    if (newest != 0) {
-        return found;
-    }
-    // The library makes 0 of an answer that it cannot read, too.
     const auto body = Exchange{library}.newestEvent();
     if (!body) {
-        return withoutAnswer(found, over, none);
+        return withoutAnswer(found, over, "it accepts connections and gives no answer");
     }
-    return hasNumber(*body, newest) ? found : malformed(found, log, *body);
+    constexpr int noAnswer = -1;  // what hosts take for it
+    const int newest = newestEventIn(library, *body);
+    library.function<void(int)>("setRAIDEventSequenceNumber")(newest);
+    if (newest == noAnswer || (newest == 0 && !hasZero(*body))) {
+        return malformed(found, log, *body);
+    }
+    found.finding = "its newest event is " + std::to_string(newest);
+    return found;
 }
 
 Examined examinedConfiguration(const Library& library, const std::stop_token& over) {

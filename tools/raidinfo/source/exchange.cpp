@@ -2,8 +2,10 @@
 
 #include <algorithm>
 #include <cstdlib>
+#include <cstring>
 #include <limits>
 #include <memory>
+#include <new>
 
 #include "agent/requests.h"
 
@@ -15,6 +17,8 @@ struct FreeBytes {
         std::free(bytes);  // NOLINT(cppcoreguidelines-no-malloc): the library's is malloc'ed
     }
 };
+
+using Bytes = std::unique_ptr<char, FreeBytes>;
 
 int bounded(std::int64_t number) {
     return static_cast<int>(std::min<std::int64_t>(number, std::numeric_limits<int>::max()));
@@ -46,8 +50,18 @@ std::optional<std::string> Exchange::nextEvent(std::int64_t number) const {
 }
 
 std::optional<std::string> Exchange::answerTo(const std::string& request) const {
-    const std::unique_ptr<char, FreeBytes> body{exchange(request.c_str())};
+    const Bytes body{exchange(request.c_str())};
     return body ? std::optional<std::string>{body.get()} : std::nullopt;
+}
+
+int newestEventIn(const Library& library, const std::string& body) {
+    Bytes copy{strdup(body.c_str())};
+    if (!copy) {
+        throw std::bad_alloc{};
+    }
+    // The library frees what it reads.
+    return library.function<int(char*, int)>("_Z21processReturnValueXMLPci")(
+        copy.release(), static_cast<int>(body.size()));
 }
 
 }  // namespace raidinfo

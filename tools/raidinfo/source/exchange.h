@@ -33,4 +33,7 @@ private:
     char* (*exchange)(const char*);
 };
 
+/// The number of the newest event by the answer's body; 0 where the library can read none.
+[[nodiscard]] int newestEventIn(const Library& library, const std::string& body);
+
 }  // namespace raidinfo
