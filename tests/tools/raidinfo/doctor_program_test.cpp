@@ -165,6 +165,25 @@ TEST(DoctorCommand, SaysThatTheQuestionForEventsGetsNoAnswer) {
     EXPECT_THAT(result.output, ContainsRegex("Events +bad +it gave no answer"));
 }
 
+TEST(DoctorCommand, GivesADroppedConfigurationASecondChance) {
+    const ScriptedService service{{probe, sevenIsNewest, Connection{},
+                                   answering(configuration(sampleAdapter())),
+                                   answering(eventBatch({7}))}};
+    const Result result = run({"doctor"});
+    EXPECT_EQ(result.status, 0);
+    EXPECT_THAT(result.output, AllOf(ContainsRegex("Configuration +ok +well-formed"),
+                                     ContainsRegex("Lists +ok +1 pellion_adapters, 2 channels")));
+}
+
+TEST(DoctorCommand, TellsTheReadersOwnMessageOfASecondAnswer) {
+    const std::string adapter = complex("adapter", "o:LSIAdapter", simple({{"colour", "red"}}));
+    const ScriptedService service{{probe, sevenIsNewest, Connection{},
+                                   answering(configuration(adapter)), answering(eventBatch({7}))}};
+    const Result result = run({"doctor"});
+    EXPECT_EQ(result.status, 76);
+    EXPECT_THAT(result.output, ContainsRegex("Configuration +bad +XML syntax error: .*colour"));
+}
+
 TEST(DoctorCommand, TellsHowThePageOfAnotherServerBegins) {
     const ScriptedService service{
         {probe, sevenIsNewest, otherPage, otherPage, answering(eventBatch({7}))}};

@@ -86,6 +86,8 @@ Examined examinedNewestEvent(const Library& library, const std::stop_token& over
     return found;
 }
 
+// A configuration that is there was read well. A service that may have come up in between is given
+// a second chance, as everywhere; that answer is kept, to say what it is if it cannot be read.
 Examined examinedConfiguration(const Library& library, const std::stop_token& over) {
     Examined found{"well_formed", "Configuration", Outcome::fine, "well-formed"};
     const LibraryLog log{library};
@@ -98,6 +100,9 @@ Examined examinedConfiguration(const Library& library, const std::stop_token& ov
         body = "";  // A reader that says something has had an answer.
     } else if (!over.stop_requested()) {
         body = Exchange{library}.configuration();
+        if (body && publishConfiguration(library, *body)) {
+            return found;
+        }
     }
     return body ? malformed(found, log, *body) : withoutAnswer(found, over, "it gave no answer");
 }

@@ -74,23 +74,30 @@ recording::Recording readRecording(const std::filesystem::path& path) {
 Inventory recordedInventory(const Library& library, const recording::Recording& recorded) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
     bool isAnswered = false;
-    bool isRead = false;
-    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend() && !isRead;
+    bool isPublished = false;
+    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend() && !isPublished;
          ++entry) {
         if (entry->question == Question::configuration && entry->body) {
             isAnswered = true;
-            readSaved(library, readConfiguration, *entry->body);
-            isRead = *system != nullptr;
+            isPublished = publishConfiguration(library, *entry->body);
         }
     }
     if (!isAnswered) {
         throw nothingRecorded(recorded, "configuration");
     }
-    if (!isRead) {
+    if (!isPublished) {
         throw malformedAnswer();
     }
-    callWithoutExchange(library, "RAIDinit");
     return {RecordReader{library}.readInventory(), (*system)->getAdapters()};
+}
+
+bool publishConfiguration(const Library& library, const std::string& body) {
+    readSaved(library, readConfiguration, body);
+    if (*library.variable<const void*>("raidSystem") == nullptr) {
+        return false;
+    }
+    callWithoutExchange(library, "RAIDinit");
+    return true;
 }
 
 std::optional<Records> eventsIn(const Library& library, RecordReader& reader,

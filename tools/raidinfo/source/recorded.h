@@ -20,6 +20,9 @@ namespace raidinfo {
 [[nodiscard]] Inventory recordedInventory(const Library& library,
                                           const recording::Recording& recorded);
 
+/// Publishes the configuration of an answer's body; returns whether the library can read it.
+[[nodiscard]] bool publishConfiguration(const Library& library, const std::string& body);
+
 /// The events of an answer's body; nothing where the library cannot read it.
 [[nodiscard]] std::optional<Records> eventsIn(const Library& library, RecordReader& reader,
                                               const std::string& body);
