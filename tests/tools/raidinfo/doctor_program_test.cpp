@@ -258,6 +258,23 @@ TEST_F(DoctorsHint, SaysWhyTheSettingsFileHasNoLevel) {
                      "it is longer than 1048576 bytes, and is not read; log level 0");
 }
 
+TEST_F(DoctorsHint, SaysHowMuchOfALevelCounts) {
+    expectOfSettings("LogLevel=8abc\n",
+                     "of its LogLevel \"8abc\" only the number that it begins with counts; "
+                     "log level 8");
+    expectOfSettings("LogLevel=-8.5\n",
+                     "of its LogLevel \"-8.5\" only the number that it begins with counts; "
+                     "log level -8, which logs nothing, as 0 does");
+    expectOfSettings("LogLevel=+-8\n", "its LogLevel \"+-8\" is not a number; log level 0");
+    expectOfSettings("LogLevel=+\n", "its LogLevel \"+\" is not a number; log level 0");
+}
+
+// The kernel gives some files a page, and then fewer bytes.
+TEST_F(DoctorsHint, SaysThatASettingsFileCannotBeReadWhole) {
+    std::filesystem::create_symlink("/sys/devices/system/cpu/online", raid::test::settingsPath);
+    expectLook("settings", "it cannot be read whole, and is not read; log level 0");
+}
+
 TEST_F(DoctorsHint, SaysThatANegativeLevelLogsNothing) {
     raid::test::writeLogLevel(-8);
     expectLook("settings", "RAIDInstrumentation.ini; log level -8, which logs nothing, as 0 does");

@@ -3,12 +3,12 @@
 #include <unistd.h>
 
 #include <cerrno>
-#include <exception>
 #include <filesystem>
 #include <limits>
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <system_error>
 
 #include "orvo/property_file.h"
@@ -30,9 +30,17 @@ std::optional<fs::path> placeOf(const fs::path& name) {
 
 std::string reasonOf(int error) { return std::generic_category().message(error); }
 
-bool isWholeNumber(const std::string& text) {
-    const std::size_t digits = text.find_first_not_of("+-");
-    return digits <= 1 && text.find_first_not_of("0123456789", digits) == std::string::npos;
+/// The library takes the number that the text begins with, and 0 where there is none.
+std::string troubleOfLevel(const std::string& text) {
+    const bool isSigned = text.starts_with('+') || text.starts_with('-');
+    const std::string_view number = std::string_view{text}.substr(isSigned ? 1 : 0);
+    const std::size_t end = number.find_first_not_of("0123456789");
+    if (number.empty() || end == 0) {
+        return "its LogLevel \"" + text + "\" is not a number";
+    }
+    return end == std::string_view::npos
+               ? ""
+               : "of its LogLevel \"" + text + "\" only the number that it begins with counts";
 }
 
 /// What keeps the level from the file from the library; "" where nothing does.
@@ -44,17 +52,19 @@ std::string troubleOf(const fs::path& file) {
     if (access(file.c_str(), R_OK) != 0) {
         return "it cannot be read: " + reasonOf(errno);
     }
+    if (const auto size = fs::file_size(file, unknown);
+        !unknown && size > Orvo::PropertyFile::sizeLimit) {
+        return "it is longer than " + std::to_string(Orvo::PropertyFile::sizeLimit) +
+               " bytes, and is not read";
+    }
     Orvo::PropertyFile settings{Orvo::File::Path{file.string()}};
     try {
         settings.open(0);
-        const std::string level =
-            Orvo::make_string(settings.getValue(Orvo::make_wstring("LogLevel")));
-        return isWholeNumber(level) ? "" : "its LogLevel \"" + level + "\" is not a number";
+        return troubleOfLevel(Orvo::make_string(settings.getValue(Orvo::make_wstring("LogLevel"))));
     } catch (const std::out_of_range&) {
         return "it has no LogLevel";
-    } catch (const std::exception&) {
-        return "it is longer than " + std::to_string(Orvo::PropertyFile::sizeLimit) +
-               " bytes, and is not read";
+    } catch (const std::runtime_error&) {
+        return "it cannot be read whole, and is not read";
     }
 }
 
