@@ -1,7 +1,6 @@
 #include "codebook/code_book.h"
 
 #include <algorithm>
-#include <array>
 #include <utility>
 
 #include "inventory/value.h"

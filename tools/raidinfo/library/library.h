@@ -11,8 +11,8 @@ constexpr int numbersAsked = 101;
 
 /// The loaded libRAIDInstrumentation, unloaded with its last copy. The program calls it only
 /// through the exported names looked up here; of the library's sources it has compiled in the
-/// classes of the model, whose getters are inline, and what recordings need to ask and to read as
-/// the library does.
+/// classes of the model, whose getters are inline, and what it takes to ask the service, to read
+/// the settings and to know blanks as the library does.
 class Library {
 public:
     /// Loads `path`; without one the library beside this program, else the installed one.
