@@ -45,7 +45,7 @@ Startup startReplay(const std::string& path) {
                  parseUtc(recording->startedAt).value_or(usualEpoch),
                  {}};
     if (recording->cutShort)
-        made.warning = path + ": the last entry is cut short and left out";
+        made.warning = path + ": " + std::string(recording::cutShortNotice);
     return made;
 }
 

@@ -192,6 +192,8 @@ private:
 
 }  // namespace
 
+bool isNamedRecording(std::string_view text) { return Line(text, 0).take().text == name; }
+
 Recording parse(std::string_view text) { return Reader(text).read(); }
 
 std::string heading(std::string_view startedAt) {

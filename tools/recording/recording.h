@@ -40,6 +40,12 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// What is to be said of a recording that is cut short.
+inline constexpr std::string_view cutShortNotice = "the last entry is cut short and left out";
+
+// Whether the text calls itself a recording, which may still be malformed.
+[[nodiscard]] bool isNamedRecording(std::string_view text);
+
 // Reads a whole file. Throws RecordingError.
 [[nodiscard]] Recording parse(std::string_view text);
 

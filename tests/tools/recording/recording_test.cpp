@@ -109,6 +109,14 @@ TEST(Recording, MayLastForAges) {
     EXPECT_THAT(parse(start + written(entry)).entries, ElementsAre(entry));
 }
 
+TEST(Recording, IsKnownByItsFirstWord) {
+    EXPECT_TRUE(isNamedRecording(start));
+    EXPECT_TRUE(isNamedRecording("raid-recording 2"));
+    EXPECT_TRUE(isNamedRecording("raid-recording\n"));
+    for (const char* const other : {"", "\n", "raid-recordings 1\n", " raid-recording 1\n", "{}"})
+        EXPECT_FALSE(isNamedRecording(other)) << other;
+}
+
 struct Malformation {
     std::string text;
     std::string message;

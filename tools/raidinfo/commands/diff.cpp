@@ -20,7 +20,7 @@ constexpr int different = 1;
 
 Json inventoryIn(const std::string& path, const Session& session, std::vector<Trouble>& troubles) {
     const std::string text = readFile(path);
-    if (text.starts_with("raid-recording ")) {
+    if (recording::isNamedRecording(text)) {
         const recording::Recording recorded = readRecording(path);
         Json tree = treeJson(Trees{recordedInventory(session.library(), recorded)}.adapters());
         for (Trouble& trouble : troublesOf(recorded, path)) {

@@ -89,7 +89,7 @@ Source sourceOf(const Options& options) {
 std::vector<Trouble> troublesOf(const recording::Recording& recorded, const std::string& name) {
     return recorded.cutShort
                ? std::vector<Trouble>{{"recording_cut_short",
-                                       name + ": the last entry is cut short and left out"}}
+                                       name + ": " + std::string{recording::cutShortNotice}}}
                : std::vector<Trouble>{};
 }
 

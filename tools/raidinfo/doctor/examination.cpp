@@ -82,7 +82,7 @@ Examined published(const Library& library) {
     int adapters = 0;
     for (const Kind& kind : inventoryKinds()) {
         const int count = library.function<int()>(kind.count)();
-        adapters += kind.id <= KindId::vantryAdapter ? count : 0;
+        adapters += std::ranges::find(adapterKinds, kind.id) != adapterKinds.end() ? count : 0;
         if (count > 0) {
             counts.push_back(std::to_string(count) + " " + std::string{kind.key});
         }

@@ -21,9 +21,10 @@ struct Examined {
     ExitStatus status = ExitStatus::ok;  ///< of the program, where the outcome is bad
 };
 
+inline constexpr auto outcomeWords = std::to_array<std::string_view>({"ok", "look", "bad"});
+
 [[nodiscard]] constexpr std::string_view wordOf(Examined::Outcome outcome) {
-    constexpr auto words = std::to_array<std::string_view>({"ok", "look", "bad"});
-    return words.at(static_cast<std::size_t>(outcome));
+    return outcomeWords.at(static_cast<std::size_t>(outcome));
 }
 
 }  // namespace raidinfo

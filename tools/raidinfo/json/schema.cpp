@@ -6,6 +6,7 @@
 #include <utility>
 #include <vector>
 
+#include "doctor/examined.h"
 #include "health/severity.h"
 #include "inventory/kinds.h"
 #include "inventory/overall_status.h"
@@ -111,7 +112,7 @@ Json showSchema() { return object({{"kind", type("string")}, {"record", type("ob
 
 Json findingSchema() {
     return object({{"check", type("string")},
-                   {"outcome", Json::object({{"enum", {"ok", "look", "bad"}}})},
+                   {"outcome", Json::object({{"enum", outcomeWords}})},
                    {"finding", type("string")}});
 }
 
