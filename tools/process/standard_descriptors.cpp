@@ -7,11 +7,11 @@ namespace process {
 
 namespace {
 
-void fill(int descriptor) noexcept {
+void fill(int descriptor, int access) noexcept {
     if (::fcntl(descriptor, F_GETFD) >= 0)
         return;
     // Kept when the program starts another, which has the same need.
-    const int opened = ::open("/dev/null", O_RDWR);
+    const int opened = ::open("/dev/null", access);
     if (opened < 0 || opened == descriptor)
         return;
     ::dup2(opened, descriptor);
@@ -21,8 +21,9 @@ void fill(int descriptor) noexcept {
 }  // namespace
 
 void fillStandardDescriptors() noexcept {
-    fill(STDIN_FILENO);
-    fill(STDERR_FILENO);
+    fill(STDIN_FILENO, O_RDWR);
+    fill(STDOUT_FILENO, O_RDONLY);
+    fill(STDERR_FILENO, O_RDWR);
 }
 
 }  // namespace process

@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 #include <unistd.h>
 
+#include <cerrno>
 #include <filesystem>
 #include <string>
 #include <vector>
@@ -60,15 +61,21 @@ TEST(StandardDescriptors, OfInputAndErrorsLeadToTheNullDeviceWhenTheyAreClosed) 
     EXPECT_EQ(filesAfterFilling({0, 2}), (std::vector{null, output, null}));
 }
 
-TEST(StandardDescriptors, OfOutputStaysClosed) {
-    EXPECT_EQ(filesAfterFilling({0, 1, 2}), (std::vector{null, std::string(), null}));
+TEST(StandardDescriptors, OfOutputLeadsToWhatRefusesToBeWrittenWhenItIsClosed) {
+    const Closed closing({STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO});
+    fillStandardDescriptors();
+    EXPECT_EQ(fileOf(STDOUT_FILENO), null);
+    errno = 0;
+    EXPECT_EQ(::write(STDOUT_FILENO, "x", 1), -1);
+    EXPECT_EQ(errno, EBADF);
+    EXPECT_EQ(::write(STDERR_FILENO, "x", 1), 1);
 }
 
 TEST(StandardDescriptors, AreFilledByWhatAStartedProgramKeeps) {
-    const Closed closing({STDIN_FILENO, STDERR_FILENO});
+    const Closed closing({STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO});
     fillStandardDescriptors();
-    EXPECT_EQ(::fcntl(STDIN_FILENO, F_GETFD), 0);
-    EXPECT_EQ(::fcntl(STDERR_FILENO, F_GETFD), 0);
+    for (const int descriptor : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
+        EXPECT_EQ(::fcntl(descriptor, F_GETFD), 0) << descriptor;
 }
 
 }  // namespace

@@ -104,6 +104,21 @@ TEST_F(RunningProgram, KeepsThePlaceOfAnInputAndOfErrorsThatAreClosed) {
     EXPECT_EQ(program->exitStatus(), 0);
 }
 
+// Nobody has asked for what a running service says.
+TEST_F(RunningProgram, GoesOnWithoutAnOutput) {
+    const std::vector<std::string> arguments{"--port", "0", "system.xml"};
+    for (const Streams& streams :
+         {Streams{.closed = {STDOUT_FILENO}}, Streams{.outputFile = "/dev/full"}}) {
+        program.emplace(arguments, streams);
+        program->type("set system name=elm\nreboot\n");
+        EXPECT_EQ(program->readErrorLine(), "raidsim: unknown command \"reboot\"");
+        EXPECT_EQ(program->fileOf(STDOUT_FILENO),
+                  streams.outputFile == nullptr ? "/dev/null" : streams.outputFile);
+        program->type("quit\n");
+        EXPECT_EQ(program->exitStatus(), 0);
+    }
+}
+
 TEST_F(RunningProgram, InterruptEndsItAlthoughAClientWaits) {
     start();
     Client client(port);
@@ -267,9 +282,12 @@ TEST(Program, WritesAGeneratedDocumentAndEnds) {
 
 TEST(Program, SaysSoWhenItsOutputCannotBeWritten) {
     for (const char* const word : {"generate", "completion", "--help"}) {
-        Program program({word}, {.outputFile = "/dev/full"});
-        EXPECT_EQ(program.readErrors(), "raidsim: cannot write the output\n");
-        EXPECT_EQ(program.exitStatus(), 74);
+        for (const Streams& streams :
+             {Streams{.outputFile = "/dev/full"}, Streams{.closed = {STDOUT_FILENO}}}) {
+            Program program({word}, streams);
+            EXPECT_EQ(program.readErrors(), "raidsim: cannot write the output\n");
+            EXPECT_EQ(program.exitStatus(), 74);
+        }
     }
 }
 

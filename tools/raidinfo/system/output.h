@@ -1,7 +1,6 @@
 #pragma once
 
 #include <filesystem>
-#include <optional>
 #include <string_view>
 
 #include "system/descriptor.h"
@@ -14,7 +13,7 @@ namespace raidinfo {
 
 /// The program's standard output, kept clean: the library prints a line per exchange on descriptor
 /// 1, so that one is pointed at the null device and the program writes to a copy of the original.
-/// That it is closed is told when something is to be written.
+/// That there is none is told when something is to be written.
 class Output {
 public:
     Output();
@@ -22,11 +21,10 @@ public:
     /// Writes all of the text, or fails with the reason.
     void write(std::string_view text) const;
 
-    /// Negative where there is none.
-    [[nodiscard]] int descriptor() const noexcept { return original ? original->get() : -1; }
+    [[nodiscard]] int descriptor() const noexcept { return original.get(); }
 
 private:
-    std::optional<Descriptor> original;
+    Descriptor original;
 };
 
 }  // namespace raidinfo
