@@ -13,7 +13,8 @@ from .text import TextBuffer
 LARGEST_NUMBER = 2**31 - 1
 # The library asks for a hundred more, and from further above its numbers would overflow.
 _HIGHEST_ASKED = LARGEST_NUMBER - NUMBERS_ASKED + 1
-# The search behind a gap begins with so many numbers, and goes on with so many times more.
+# The search behind a gap begins with so many numbers, and goes on with so many times more: raidinfo
+# searches in the same way, and goes on from the same number.
 _NUMBERS_SEARCHED = 8 * NUMBERS_ASKED
 _WIDENING = 8
 # Pauses grow from the shortest one while nothing new comes, doubling so often.
@@ -86,7 +87,8 @@ class Follower:
 
     def _pass_over(self, first: int, newest: int, stopping: threading.Event) -> None:
         """The service no longer keeps the events with the numbers asked for, but some behind them."""
-        low, count = self._continuity.next, _NUMBERS_SEARCHED
+        expected = self._continuity.next
+        low, count = expected, _NUMBERS_SEARCHED
         while low <= newest and not stopping.is_set():
             high = min(low + count - 1, newest)
             there = self._library.numbers_between(low, high)
@@ -98,7 +100,9 @@ class Follower:
                 return
             low, count = high + 1, count * _WIDENING
         if not stopping.is_set():
-            self._continuity.pass_over_to(newest - NUMBERS_ASKED + 1)
+            # What comes late is a little below the newest number; yet what was searched in vain is
+            # not asked for again from its beginning, without end.
+            self._continuity.pass_over_to(max(newest - NUMBERS_ASKED + 1, expected + 1))
 
     def _doubt_emptiness(self, stopping: threading.Event) -> None:
         """The service has no event any more, if it says so twice: an answer without a number reads

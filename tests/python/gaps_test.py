@@ -134,6 +134,19 @@ def test_a_newest_number_without_an_event_is_asked_for_all_the_same(
         assert starts(service) == [1, 1, 600]
 
 
+def test_behind_a_newest_number_without_an_event_nothing_is_asked_for_twice(
+    raid: RAIDInstrumentation,
+) -> None:
+    with ScriptedService(
+        newest=(newest_event(60), newest_event(115)),
+        wait=(AWAITED,),
+        events=(events(10, 60), events(60), events(60), events(), events(115)),
+    ) as service:
+        assert numbers_of(raid, 0, 3) == [10, 60, 115]
+        # What was missing is looked for twice before the search, which begins behind the last one.
+        assert starts(service) == [1, 11, 11, 61, 62]
+
+
 def test_what_happens_below_a_newest_number_that_was_lost_comes(raid: RAIDInstrumentation) -> None:
     with ScriptedService(
         newest=(newest_event(700), newest_event(700), newest_event(5)),

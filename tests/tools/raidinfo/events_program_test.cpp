@@ -269,6 +269,28 @@ TEST(EventsCommand, WalksOnWhereTheServiceDoesNotAnswerTheSearchForTheNextEvent)
     EXPECT_THAT(service.request(6), HasSubstr(">102</as:start>"));
 }
 
+// What comes late has a number a little below the newest one.
+TEST(EventsCommand, AsksForWhatIsBelowANewestNumberWithoutAnEvent) {
+    const Connection nothing = answering(eventBatch({}));
+    const ScriptedService service{{newest(700), awaited(), nothing, nothing, newest(700), awaited(),
+                                   answering(eventBatch({650}))}};
+    const Result result = run({"events", "--json", "--since", "1", "--count", "1"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(650));
+    EXPECT_THAT(service.request(6), HasSubstr(">600</as:start>"));
+}
+
+TEST(EventsCommand, AsksForNothingTwiceBehindANewestNumberWithoutAnEvent) {
+    const Connection last = answering(eventBatch({60}));
+    const ScriptedService service{{newest(60), awaited(), answering(eventBatch({10, 60})),
+                                   newest(115), awaited(), last, answering(eventBatch({})),
+                                   newest(115), awaited(), answering(eventBatch({115}))}};
+    const Result result = run({"events", "--json", "--since", "10", "--count", "3"});
+    EXPECT_THAT(numbers(result.output), ElementsAre(10, 60, 115));
+    EXPECT_THAT(service.request(5), HasSubstr(">11</as:start>"));
+    EXPECT_THAT(service.request(6), HasSubstr(">61</as:start><as:end xsi:type=\"xsd:int\">115</"));
+    EXPECT_THAT(service.request(9), HasSubstr(">62</as:start>"));
+}
+
 TEST(EventsCommand, ShowsAnotherEventThatUsesTheLastNumberWhileItWaits) {
     Simulator simulator{"small-server.xml"};
     simulator.command("event sequenceNumber=45 string=one");

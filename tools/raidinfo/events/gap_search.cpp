@@ -7,6 +7,7 @@
 namespace raidinfo {
 namespace {
 
+// The Python module searches with the same widths and goes on from the same number.
 constexpr std::int64_t growth = 8;
 
 /// The least number of a batch from `first` on.
@@ -28,19 +29,22 @@ GapSearch::GapSearch(const Library& searched)
 
 std::optional<std::int64_t> GapSearch::leastNumber(std::int64_t first, std::int64_t last,
                                                    const std::stop_token& stop) {
-    for (std::int64_t width = growth * numbersAsked; first <= last; width *= growth) {
-        const std::int64_t end = std::min(first + width - 1, last);
-        const auto answer = service.events(first, end);
+    std::int64_t from = first;
+    for (std::int64_t width = growth * numbersAsked; from <= last; width *= growth) {
+        const std::int64_t end = std::min(from + width - 1, last);
+        const auto answer = service.events(from, end);
         const auto batch = answer ? eventsIn(library, reader, *answer) : std::nullopt;
         if (!batch || stop.stop_requested()) {
             return std::nullopt;
         }
-        if (const auto least = leastIn(*batch, first)) {
+        if (const auto least = leastIn(*batch, from)) {
             return least;
         }
-        first = end + 1;
+        from = end + 1;
     }
-    return last;
+    // What comes late is a little below the last number; yet what was searched in vain is not asked
+    // for again from its beginning, without end.
+    return std::max(last - numbersAsked + 1, first + 1);
 }
 
 }  // namespace raidinfo

@@ -17,8 +17,9 @@ class GapSearch {
 public:
     explicit GapSearch(const Library& searched);
 
-    /// The least number from `first` to `last` of an event that the service has; `last` where there
-    /// is none. Nothing when it gives no answer that can be read, or stop is requested.
+    /// The least number from `first` to `last` of an event that the service has. Where there is
+    /// none, the number behind `first` to go on from: what the library reads at a time holds `last`
+    /// then. Nothing when it gives no answer that can be read, or stop is requested.
     [[nodiscard]] std::optional<std::int64_t> leastNumber(std::int64_t first, std::int64_t last,
                                                           const std::stop_token& stop);
 
