@@ -20,8 +20,10 @@ _REQUEST = (
 )
 
 _TAG = re.compile(rb"<as:sequenceNumber[\s/>]")
-_NUMBER = re.compile(rb"<as:sequenceNumber(?:\s[^<>]*)?>\s*(-?\d{1,10})\s*</as:sequenceNumber")
-_END = b"</m:getEventsResponse"
+_ELEMENT = re.compile(rb"<as:sequenceNumber(?:\s[^<>]*)?(?:/>|>([^<]*)</as:sequenceNumber\s*>)")
+# The library reads no further than here, either.
+_END = re.compile(rb"</ac:events\s*>|<ac:events(?:\s[^<>]*)?/>")
+_DIGITS = re.compile(rb"\s*([+-]?)0*(\d{0,11})")
 
 
 def request_for(first: int, last: int) -> bytes:
@@ -31,7 +33,15 @@ def request_for(first: int, last: int) -> bytes:
 
 
 def numbers_in(answer: bytes) -> list[int] | None:
-    """The numbers of the events in an answer; None where any of them may be unknown."""
-    numbers = [int(number) for number in _NUMBER.findall(answer)]
-    is_whole = _END in answer and len(numbers) == len(_TAG.findall(answer))
+    """The numbers of the events in an answer as the library reads them; None where it may read none."""
+    numbers = [_number(text) for text in _ELEMENT.findall(answer)]
+    is_whole = _END.search(answer) is not None and len(numbers) == len(_TAG.findall(answer))
     return numbers if is_whole else None
+
+
+def _number(text: bytes) -> int:
+    """What the text begins with, or else 0; numbers of more than 32 bits are the last that there are."""
+    digits = _DIGITS.match(text)
+    assert digits is not None
+    sign, magnitude = digits.groups()
+    return max(-(2**31), min(int(sign + (magnitude or b"0")), 2**31 - 1))
