@@ -98,6 +98,21 @@ TEST(PoorRecording, TellsOfTheMalformedEventsBetweenOthers) {
     EXPECT_THAT(codesIn(runFrom({"events", "--json"})), ElementsAre("malformed_answer"));
 }
 
+TEST(PoorRecording, OfAMalformedConfigurationBehindAnotherShowsThatAndSaysSo) {
+    const std::string configured = configurationEntry(configuration(sampleAdapter()));
+    writeRecording({configured, configurationEntry("<garbage>")});
+    const std::string told =
+        "raidinfo: saved.rec: later configurations that are malformed and left out: 1\n";
+    for (const std::vector<std::string>& command : std::vector<std::vector<std::string>>{
+             {"tree"}, {"health"}, {"snapshot", "saved.json"}, {"list", "fans"}}) {
+        EXPECT_EQ(runFrom(command).errors, told);
+    }
+    EXPECT_THAT(codesIn(runFrom({"tree", "--json"})), ElementsAre("malformed_answer"));
+    EXPECT_EQ(run({"diff", poorFile, poorFile}).errors, told + told);
+    writeRecording({configurationEntry("<garbage>"), configured});
+    EXPECT_EQ(runFrom({"tree"}).errors, "") << "the last one is what counts";
+}
+
 TEST(PoorRecording, ThatIsCutShortIsShownAndSaysSo) {
     writeRecording({configurationEntry(configuration(sampleAdapter())),
                     eventsEntry(eventBatch({1})), "answer 5 events 100\n<?xml"});

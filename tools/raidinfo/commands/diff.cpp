@@ -22,8 +22,9 @@ Json inventoryIn(const std::string& path, const Session& session, std::vector<Tr
     const std::string text = readFile(path);
     if (recording::isNamedRecording(text)) {
         const recording::Recording recorded = readRecording(path);
-        Json tree = treeJson(Trees{recordedInventory(session.library(), recorded)}.adapters());
-        for (Trouble& trouble : troublesOf(recorded, path)) {
+        RecordedInventory read = recordedInventory(session.library(), recorded);
+        Json tree = treeJson(Trees{std::move(read.inventory)}.adapters());
+        for (Trouble& trouble : troublesOf(recorded, path, read.leftOut)) {
             complain(trouble.message);
             troubles.push_back(std::move(trouble));
         }

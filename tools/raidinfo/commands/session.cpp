@@ -40,7 +40,9 @@ GridLayout Session::layout() const { return {.width = screen.width, .painter = p
 
 Trees Session::inventory() const {
     if (answers) {
-        Trees trees{recordedInventory(lib, *answers)};
+        RecordedInventory recorded = recordedInventory(lib, *answers);
+        leftOut = recorded.leftOut;
+        Trees trees{std::move(recorded.inventory)};
         for (const Trouble& trouble : troublesOfSource()) {
             complain(trouble.message);
         }
@@ -58,7 +60,8 @@ Trees Session::inventory() const {
 }
 
 std::vector<Trouble> Session::troublesOfSource() const {
-    return answers ? troublesOf(*answers, chosen.recording->string()) : std::vector<Trouble>{};
+    return answers ? troublesOf(*answers, chosen.recording->string(), leftOut)
+                   : std::vector<Trouble>{};
 }
 
 const CodeBook& Session::codeBook() const {
@@ -86,11 +89,19 @@ Source sourceOf(const Options& options) {
                              : Source{"service", ServiceAddress::inShort()};
 }
 
-std::vector<Trouble> troublesOf(const recording::Recording& recorded, const std::string& name) {
-    return recorded.cutShort
-               ? std::vector<Trouble>{{"recording_cut_short",
-                                       name + ": " + std::string{recording::cutShortNotice}}}
-               : std::vector<Trouble>{};
+std::vector<Trouble> troublesOf(const recording::Recording& recorded, const std::string& name,
+                                std::size_t leftOut) {
+    std::vector<Trouble> troubles;
+    if (leftOut > 0) {
+        troubles.push_back({troubleCode(ExitStatus::malformedAnswer),
+                            name + ": later configurations that are malformed and left out: " +
+                                std::to_string(leftOut)});
+    }
+    if (recorded.cutShort) {
+        troubles.push_back(
+            {"recording_cut_short", name + ": " + std::string{recording::cutShortNotice}});
+    }
+    return troubles;
 }
 
 void complain(std::string message) {

@@ -73,15 +73,16 @@ private:
     std::stop_token stopToken;
     Terminal screen;
     std::optional<recording::Recording> answers;
+    mutable std::size_t leftOut = 0;       ///< configurations of the recording, by inventory()
     mutable std::optional<CodeBook> book;  ///< read when first asked for
 };
 
 /// What the JSON of these options tells about.
 [[nodiscard]] Source sourceOf(const Options& options);
 
-/// What is missing in the recording of this name.
+/// What is missing in the recording of this name, of which so many configurations were left out.
 [[nodiscard]] std::vector<Trouble> troublesOf(const recording::Recording& recorded,
-                                              const std::string& name);
+                                              const std::string& name, std::size_t leftOut);
 
 /// One line on standard error, whatever the message holds.
 void complain(std::string message);

@@ -24,11 +24,12 @@ Examined withoutAnswer(Examined found, const std::stop_token& over, const char* 
     return found;
 }
 
-/// Enough of it to tell a page of another server from an answer.
+/// Enough of it to tell a page of another server from an answer. Of one whose headers end their
+/// lines in CR LF, as those of other servers do, the library takes none of the page for the body.
 std::string beginningOf(const std::string& body) {
     constexpr std::size_t longest = 60;
     if (body.empty()) {
-        return "it is empty";
+        return "the library finds no body in it";
     }
     std::string text = body.substr(0, longest);
     std::ranges::replace_if(

@@ -1,6 +1,8 @@
 #include <algorithm>
 #include <cstdint>
 #include <iterator>
+#include <set>
+#include <string>
 #include <utility>
 
 #include "health/condition.h"
@@ -119,19 +121,28 @@ private:
         }
         result.byName = true;
         result.text += name;
-        std::vector<std::string> names;
-        for (const auto& row : *codes) {
-            names.push_back(row.second);
-            if (row.second == name) {
-                result.operands.emplace_back(row.first);
+        if (!named.insert(name).second) {
+            return;  // Said twice in the same list.
+        }
+        const std::size_t before = result.operands.size();
+        for (const auto& [code, meaning] : *codes) {
+            if (meaning == name) {
+                result.operands.emplace_back(code);
             }
         }
         // Without any codes all are unknown, and that is what the code book wants.
-        if (!codes->empty() && std::ranges::find(names, name) == names.end()) {
-            refuse(setting.place, "no code of " + qualified + " is called \"" + name +
-                                      "\"; known: " + enumerated(names) + " (" +
-                                      std::string{codesStandAt} + ")");
+        if (!codes->empty() && result.operands.size() == before) {
+            refuseName(setting.place, name);
         }
+    }
+
+    [[noreturn]] void refuseName(const settings::Place& place, const std::string& name) const {
+        std::vector<std::string> names;
+        for (const auto& row : *codes) {
+            names.push_back(row.second);
+        }
+        refuse(place, "no code of " + qualified + " is called \"" + name + "\"; known: " +
+                          enumerated(names) + " (" + std::string{codesStandAt} + ")");
     }
 
     void requireReachable(const Setting& setting, std::int64_t number) const {
@@ -177,6 +188,7 @@ private:
     const RuleField& field;
     const CodeBook::Codes* codes;
     std::string_view codesStandAt;
+    std::set<std::string> named;  ///< of the operands so far
     Condition result;
 };
 

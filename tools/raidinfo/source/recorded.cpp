@@ -71,24 +71,19 @@ recording::Recording readRecording(const std::filesystem::path& path) {
     }
 }
 
-Inventory recordedInventory(const Library& library, const recording::Recording& recorded) {
+RecordedInventory recordedInventory(const Library& library, const recording::Recording& recorded) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
-    bool isAnswered = false;
-    bool isPublished = false;
-    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend() && !isPublished;
-         ++entry) {
-        if (entry->question == Question::configuration && entry->body) {
-            isAnswered = true;
-            isPublished = publishConfiguration(library, *entry->body);
+    std::size_t malformed = 0;
+    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend(); ++entry) {
+        if (entry->question != Question::configuration || !entry->body) {
+            continue;
         }
+        if (publishConfiguration(library, *entry->body)) {
+            return {{RecordReader{library}.readInventory(), (*system)->getAdapters()}, malformed};
+        }
+        ++malformed;
     }
-    if (!isAnswered) {
-        throw nothingRecorded(recorded, "configuration");
-    }
-    if (!isPublished) {
-        throw malformedAnswer();
-    }
-    return {RecordReader{library}.readInventory(), (*system)->getAdapters()};
+    throw malformed > 0 ? malformedAnswer() : nothingRecorded(recorded, "configuration");
 }
 
 bool publishConfiguration(const Library& library, const std::string& body) {

@@ -14,11 +14,16 @@ namespace raidinfo {
 /// Reads the file; Failures where it cannot be read or is no recording.
 [[nodiscard]] recording::Recording readRecording(const std::filesystem::path& path);
 
-/// The inventory by the recording's last configuration that the library can read. Fails as if the
-/// service had answered now: with serviceUnavailable where there is no answer, with malformedAnswer
-/// where the library can read none.
-[[nodiscard]] Inventory recordedInventory(const Library& library,
-                                          const recording::Recording& recorded);
+struct RecordedInventory {
+    Inventory inventory;
+    std::size_t leftOut = 0;  ///< later answers, which the library cannot read
+};
+
+/// By the recording's last configuration that the library can read. Fails as if the service had
+/// answered now: with serviceUnavailable where there is no answer, with malformedAnswer where the
+/// library can read none.
+[[nodiscard]] RecordedInventory recordedInventory(const Library& library,
+                                                  const recording::Recording& recorded);
 
 /// Publishes the configuration of an answer's body; returns whether the library can read it.
 [[nodiscard]] bool publishConfiguration(const Library& library, const std::string& body);
