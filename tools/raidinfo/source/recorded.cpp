@@ -5,6 +5,7 @@
 #include <unistd.h>
 
 #include <optional>
+#include <ranges>
 #include <string>
 
 #include "exit_status.h"
@@ -74,11 +75,11 @@ recording::Recording readRecording(const std::filesystem::path& path) {
 RecordedInventory recordedInventory(const Library& library, const recording::Recording& recorded) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
     std::size_t malformed = 0;
-    for (auto entry = recorded.entries.rbegin(); entry != recorded.entries.rend(); ++entry) {
-        if (entry->question != Question::configuration || !entry->body) {
+    for (const recording::Entry& entry : std::views::reverse(recorded.entries)) {
+        if (entry.question != Question::configuration || !entry.body) {
             continue;
         }
-        if (publishConfiguration(library, *entry->body)) {
+        if (publishConfiguration(library, *entry.body)) {
             return {{RecordReader{library}.readInventory(), (*system)->getAdapters()}, malformed};
         }
         ++malformed;
