@@ -66,6 +66,15 @@ TEST(EventLog, GivenSequenceNumberMustRise) {
     EXPECT_THAT(numbersIn(log.body(0, 100)), ElementsAre(40, 41));
 }
 
+TEST(EventLog, NumbersBelowOneAreTakenAtAPlaceOnly) {
+    EventLog log;
+    log.insert({{"sequenceNumber", "-9"}}, {});
+    EXPECT_THROW(log.append({{"sequenceNumber", "-4"}}), EventError);
+    log.insert({{"sequenceNumber", "-4"}}, {});
+    EXPECT_EQ(log.append({{"sequenceNumber", "1"}}), 1);
+    EXPECT_THAT(numbersIn(log.body(-100, 100)), ElementsAre(-9, -4, 1));
+}
+
 TEST(EventLog, EndsAtTheLargestNumber) {
     EventLog log;
     log.append({{"sequenceNumber", "2147483647"}});

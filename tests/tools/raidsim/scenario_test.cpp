@@ -13,6 +13,7 @@
 
 #include "control/player.h"
 #include "running_service.h"
+#include "state/path.h"
 #include "support/files.h"
 
 namespace raidsim {
@@ -152,7 +153,7 @@ TEST(Scenario, EveryChoiceIsCheckedBeforeItIsPlayed) {
 TEST(Scenario, WhatNoDocumentCanHoldIsFoundBeforeItIsPlayed) {
     raid::test::writeFile("two.fault", "title \"Two\"\nvary kept 1..2\nbody keep {kept}\n");
     raid::test::writeFile("drive.xml", "<ac:hardDrive/>");
-    constexpr std::array<std::array<std::string_view, 2>, 11> mistakes{{
+    constexpr std::array<std::array<std::string_view, 2>, 14> mistakes{{
         {"progress fan:1 50", "progress: no task runs on \"fan\""},
         {"progress fan:1 done", "progress: no task runs on \"fan\""},
         {"remove adapter:1", "remove: \"adapter\" is not added or removed while the system runs"},
@@ -166,11 +167,30 @@ TEST(Scenario, WhatNoDocumentCanHoldIsFoundBeforeItIsPlayed) {
         {"join fan:1 spares", "join: fan:1 is not a drive"},
         {"leave drive:1 adapter:1", "leave: adapter:1 is neither an array nor the spares"},
         {"fault two.fault 2", "fault: there are 2 cases, counted from 0"},
+        {"event sequenceNumber=0 type=A",
+         "event: sequenceNumber 0 needs a place: numbers start at 1"},
+        {"event sequenceNumber=-4", "event: sequenceNumber -4 needs a place: numbers start at 1"},
+        {"event sequenceNumber={0..9}",
+         "event: sequenceNumber 0 needs a place: numbers start at 1"},
     }};
     for (const auto& [command, complaint] : mistakes) {
         EXPECT_EQ(scenarioError("at 1 status\nat 2 " + std::string(command)),
                   "line 2: " + std::string(complaint));
     }
+}
+
+TEST(Scenario, AnyNumberOfAnEventMayBePlayedThatHasAPlace) {
+    EXPECT_EQ(scenarioError("at 1 event sequenceNumber=0 place=last"), "none");
+    EXPECT_EQ(scenarioError("at 1 event place=before:-4 sequenceNumber=-5"), "none");
+    EXPECT_EQ(scenarioError("at 1 event sequenceNumber=1"), "none");
+}
+
+// Whether it does shows in the document only: others may have been removed by then.
+TEST(Scenario, AStarMayNameTheOneDriveThatThereIs) {
+    Service service = test::makeService(test::smallSystem());
+    ScenarioPlayer player(parseScenario("at 1 leave channel:2/drive:* spares"));
+    player.advanceTo(1s, [&](const ScriptLine& line) { line.command(service); });
+    EXPECT_THAT(findAll(service.document().edit(), Path::parse("spares/drive:*")), IsEmpty());
 }
 
 TEST(Scenario, LinesMayEndAsOnOtherSystemsAndTheLastOneNotAtAll) {

@@ -49,7 +49,11 @@ Command event(const Arguments& arguments) {
             fields.emplace_back(name, value);
         }
     }
-    EventLog::check(fields);
+    if (place) {
+        EventLog::check(fields);
+    } else {
+        EventLog::checkWithoutPlace(fields);
+    }
     return [fields = std::move(fields), place](Service& service) {
         service.addEvent(fields, place);
         return Outcome{};

@@ -46,6 +46,7 @@ std::optional<std::string> valueOf(const EventLog::Fields& fields, std::string_v
     return value;
 }
 
+constexpr int lowest = 1;
 constexpr int highest = std::numeric_limits<int>::max();
 
 // The number given, or the next one.
@@ -74,8 +75,17 @@ void EventLog::check(const Fields& fields) {
     }
 }
 
-int EventLog::append(const Fields& fields) {
+void EventLog::checkWithoutPlace(const Fields& fields) {
     check(fields);
+    const auto given = valueOf(fields, "sequenceNumber");
+    if (given && parseInt(*given).value() < lowest) {
+        throw EventError("sequenceNumber " + *given + " needs a place: numbers start at " +
+                         std::to_string(lowest));
+    }
+}
+
+int EventLog::append(const Fields& fields) {
+    checkWithoutPlace(fields);
     const int number = numberIn(fields, last);
     if (number <= last) {
         throw EventError("sequenceNumber " + std::to_string(number) + " is not above the newest, " +

@@ -44,10 +44,12 @@ public:
     // Throws EventError for a field that an event does not have, or a number field that holds no
     // number.
     static void check(const Fields& fields);
+    // The same for an event that is given no place; throws, too, for a sequenceNumber below 1.
+    static void checkWithoutPlace(const Fields& fields);
 
     // Adds an event and calls the waiters whose wait it ends; the oldest event gives way when
-    // the log is full. Returns the event's sequence number. Throws as check does, and when a given
-    // sequenceNumber is not above the newest.
+    // the log is full. Returns the event's sequence number. Throws as checkWithoutPlace does, and
+    // when a given sequenceNumber is not above the newest.
     int append(const Fields& fields);
 
     // The same at any place, and with any number. Throws as check does, and when there is no such
