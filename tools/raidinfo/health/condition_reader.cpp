@@ -227,19 +227,20 @@ Condition readCondition(const Setting& setting, std::string_view kind,
 
 std::vector<Condition> readConditions(const Setting& setting, std::string_view kind,
                                       const std::vector<RuleField>& fields, const CodeBook& book) {
-    if (std::holds_alternative<settings::Table>(setting.value)) {
-        return {readCondition(setting, kind, fields, book)};
-    }
     std::vector<Condition> conditions;
-    for (const Setting& condition : listOf(setting)) {
-        conditions.push_back(readCondition(condition, kind, fields, book));
+    if (std::holds_alternative<settings::Table>(setting.value)) {
+        conditions.push_back(readCondition(setting, kind, fields, book));
+    } else {
+        for (const Setting& condition : listOf(setting)) {
+            conditions.push_back(readCondition(condition, kind, fields, book));
+        }
     }
     if (conditions.empty()) {
         refuse(setting.place, "the list of conditions is empty");
     }
-    const std::string contradiction = contradictionIn(conditions);
+    const std::string contradiction = contradictionIn(conditions, kind, fields, book);
     if (!contradiction.empty()) {
-        refuse(setting.place, "the conditions exclude each other: " + contradiction);
+        refuse(setting.place, contradiction);
     }
     return conditions;
 }
