@@ -9,7 +9,11 @@ bool isAmong(const std::vector<Value>& operands, const Value& value) {
     return std::ranges::find(operands, value) != operands.end();
 }
 
-int numberIn(const Value& value) { return std::get<int>(value); }
+/// Of the number to the operand; a value that nobody knows has none.
+bool compares(const Value& value, const Condition& condition, bool (*compare)(int, int)) {
+    const int* const number = std::get_if<int>(&value);
+    return number != nullptr && compare(*number, std::get<int>(condition.operands.front()));
+}
 
 }  // namespace
 
@@ -23,13 +27,13 @@ bool holds(const Condition& condition, const Value& value, bool isKnown) {
         case Operator::notIn:
             return !isAmong(operands, value) && (isKnown || !condition.byName);
         case Operator::below:
-            return numberIn(value) < numberIn(operands.front());
+            return compares(value, condition, [](int a, int b) { return a < b; });
         case Operator::above:
-            return numberIn(value) > numberIn(operands.front());
+            return compares(value, condition, [](int a, int b) { return a > b; });
         case Operator::atMost:
-            return numberIn(value) <= numberIn(operands.front());
+            return compares(value, condition, [](int a, int b) { return a <= b; });
         case Operator::atLeast:
-            return numberIn(value) >= numberIn(operands.front());
+            return compares(value, condition, [](int a, int b) { return a >= b; });
         case Operator::known:
             break;
     }

@@ -78,6 +78,14 @@ TEST(Condition, OnAnUnknownHoldsForNoWord) {
     EXPECT_TRUE(finds(machine, "enclosures", R"({ field = "overall_status", known = false })"));
 }
 
+TEST(Condition, OnAnUnknownNumberHoldsForNoBound) {
+    Machine machine;
+    machine.set(KindId::enclosure, 0, "logical_id", Unknown{});
+    for (const std::string bound : {"below = 5", "above = 5", "at_most = 5", "at_least = 5"}) {
+        EXPECT_FALSE(finds(machine, "enclosures", "{ field = \"logical_id\", " + bound + " }"));
+    }
+}
+
 TEST(Condition, OnAFieldThatTheRecordLacksDoesNotHold) {
     Machine machine;
     machine.member(0).position.reset();
