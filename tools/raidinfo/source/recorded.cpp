@@ -5,7 +5,6 @@
 #include <unistd.h>
 
 #include <optional>
-#include <ranges>
 #include <string>
 
 #include "exit_status.h"
@@ -75,7 +74,8 @@ recording::Recording readRecording(const std::filesystem::path& path) {
 RecordedInventory recordedInventory(const Library& library, const recording::Recording& recorded) {
     const RAIDSystem* const* const system = library.variable<const RAIDSystem*>("raidSystem");
     std::size_t malformed = 0;
-    for (const recording::Entry& entry : std::views::reverse(recorded.entries)) {
+    for (std::size_t before = recorded.entries.size(); before-- > 0;) {
+        const recording::Entry& entry = recorded.entries[before];
         if (entry.question != Question::configuration || !entry.body) {
             continue;
         }
