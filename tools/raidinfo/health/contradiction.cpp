@@ -40,7 +40,7 @@ Domain domainOf(const RuleField& field, const CodeBook::Codes* codes) {
             break;
         case FieldType::word:
             for (const std::string_view word : field.words) {
-                domain.known.emplace(std::string{word});
+                domain.known.insert(Value{std::string{word}});
             }
             domain.others = Domain::Others::unknown;
             break;
