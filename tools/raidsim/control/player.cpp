@@ -8,7 +8,8 @@ namespace raidsim {
 std::chrono::steady_clock::duration realTime(std::chrono::milliseconds shown, double speed) {
     using Milliseconds = std::chrono::duration<double, std::milli>;
     constexpr std::chrono::years never{100};
-    return std::chrono::round<std::chrono::steady_clock::duration>(
+    // What is finer than that depends on the registers of the machine.
+    return std::chrono::round<std::chrono::microseconds>(
         std::min(Milliseconds(shown) / speed, Milliseconds(never)));
 }
 
