@@ -18,6 +18,9 @@
 namespace raidinfo {
 namespace {
 
+static_assert(sizeof(off_t) == 8 && sizeof(time_t) == 8,
+              "a recording may grow over 2 GiB, and a file may be younger than 2038");
+
 constexpr mode_t readableByAll = 0644;
 constexpr mode_t permissionBits = 07777;
 constexpr int longestChain = 40;  ///< of links, as for the system
@@ -31,10 +34,17 @@ int opened(const std::filesystem::path& path, int flags, mode_t mode = readableB
     return open(path.c_str(), flags | O_CLOEXEC, mode);
 }
 
-/// What stands there, behind all links.
+/// What stands there, behind all links. A file of which nothing can be known is not replaced: its
+/// owner and its permissions would be lost.
 std::optional<struct stat> statusOf(const std::filesystem::path& path) {
     struct stat status = {};
-    return stat(path.c_str(), &status) == 0 ? std::optional{status} : std::nullopt;
+    if (stat(path.c_str(), &status) == 0) {
+        return status;
+    }
+    if (errno != ENOENT) {
+        throw failure(ExitStatus::cannotCreate, "cannot write", path);
+    }
+    return std::nullopt;
 }
 
 /// Where the links lead to, be something there or not.

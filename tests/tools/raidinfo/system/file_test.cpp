@@ -3,9 +3,11 @@
 #include <fcntl.h>
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <array>
+#include <cstdint>
 #include <filesystem>
 #include <string>
 
@@ -52,6 +54,18 @@ TEST_F(ReplacedFile, CanBeReadByThoseWhoCouldReadItBefore) {
         replaceFile(file, "second");
         EXPECT_EQ(fs::status(file).permissions(), mode);
     }
+}
+
+TEST_F(ReplacedFile, CanBeAsLargeAndAsYoungAsTheSystemAllows) {
+    writeFile(file, "first");
+    fs::permissions(file, ownersOnly);
+    fs::resize_file(file, std::uintmax_t{3} << 30U);
+    const std::array<timespec, 2> year2040{
+        {{.tv_sec = 2'208'988'800, .tv_nsec = 0}, {.tv_sec = 2'208'988'800, .tv_nsec = 0}}};
+    ASSERT_EQ(utimensat(AT_FDCWD, file.c_str(), year2040.data(), 0), 0);
+    replaceFile(file, "second");
+    EXPECT_EQ(readFile(file), "second");
+    EXPECT_EQ(fs::status(file).permissions(), ownersOnly);
 }
 
 TEST_F(ReplacedFile, IsTheOneThatALinkLeadsTo) {
