@@ -74,7 +74,7 @@ constexpr auto subcommands = std::to_array<Subcommand>({
          app.add_option("kind", words.kind, "The list")->type_name(value_type::kind)->required();
          app.add_option("position", words.position, "The record's place in its list, from 0")
              ->type_name("POSITION")
-             ->check(between({0, largest}))
+             ->transform(between({0, largest}))
              ->required();
      },
      [](const CLI::App&, const Words& words) -> CommandOptions {

@@ -1,9 +1,24 @@
 #include "command_line/words.h"
 
+#include <charconv>
+#include <system_error>
+
 namespace raidinfo {
 
 CLI::Validator between(Bounds bounds) {
-    return CLI::Range(bounds.least, bounds.most).description("");
+    return {[bounds](std::string& word) -> std::string {
+                int number = 0;
+                const char* const end = word.data() + word.size();
+                const auto [behind, error] = std::from_chars(word.data(), end, number);
+                if (error != std::errc{} || behind != end || number < bounds.least ||
+                    number > bounds.most) {
+                    return "Value " + word + " not in range " + std::to_string(bounds.least) +
+                           " to " + std::to_string(bounds.most);
+                }
+                word = std::to_string(number);
+                return "";
+            },
+            ""};
 }
 
 CLI::Validator notEmpty() {
@@ -15,7 +30,7 @@ CLI::Option* addNumber(CLI::App& app, const char* name, int& word, const char* m
                        const char* type, Bounds bounds) {
     return app.add_option(name, word, meaning)
         ->type_name(type)
-        ->check(between(bounds))
+        ->transform(between(bounds))
         ->take_last();
 }
 

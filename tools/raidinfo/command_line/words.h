@@ -72,6 +72,8 @@ CLI::Option* addFile(CLI::App& app, const char* name, std::string& word, const c
 /// Refuses an empty word as addFileOperand does.
 [[nodiscard]] CLI::Validator notEmpty();
 
+/// Takes decimal digits alone, and as such: a 0 in front, as of a number that a script has padded,
+/// would make octal ones of them.
 [[nodiscard]] CLI::Validator between(Bounds bounds);
 
 /// None for an empty word, which stands for an option that was not given.

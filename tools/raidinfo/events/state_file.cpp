@@ -3,6 +3,7 @@
 #include <array>
 #include <charconv>
 #include <cstdint>
+#include <limits>
 #include <string>
 #include <string_view>
 #include <system_error>
@@ -36,7 +37,8 @@ std::optional<LastShown> StateFile::read() const {
         behind = noContent == std::errc{} ? behindContent : end;
         last.content = content;
     }
-    if (noNumber != std::errc{} || std::string_view(behind, end) != "\n" || last.number < 0) {
+    if (noNumber != std::errc{} || std::string_view(behind, end) != "\n" || last.number < 0 ||
+        last.number > std::numeric_limits<int>::max()) {
         throw Failure{ExitStatus::badInput,
                       path.string() + " does not hold the number of an event"};
     }

@@ -116,6 +116,17 @@ TEST(EventsOptions, SayWhereToBeginAndWhenToEnd) {
     EXPECT_EQ(all.state, "file");
 }
 
+TEST(Numbers, AreDecimalDigits) {
+    EXPECT_EQ(command<EventsOptions>({"events", "--since", "0100"}).since, 100);
+    EXPECT_EQ(command<EventsOptions>({"events", "--since", "08"}).since, 8);
+    EXPECT_EQ(command<ShowOptions>({"show", "disk_drives", "010"}).position, 10);
+    for (const char* const word : {"0x3", "+5", " 5", "5 ", "5.0", "1e1", "five", "2147483648"}) {
+        EXPECT_THAT(
+            complaint({"events", "--since", word}),
+            HasSubstr("--since: Value " + std::string{word} + " not in range 0 to 2147483647"));
+    }
+}
+
 TEST(WatchOptions, HaveAnInterval) {
     EXPECT_EQ(command<WatchOptions>({"watch"}).interval, std::chrono::seconds{5});
     EXPECT_EQ(command<WatchOptions>({"watch", "--interval", "9"}).interval,

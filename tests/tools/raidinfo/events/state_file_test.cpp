@@ -51,8 +51,9 @@ TEST(StateFile, KeepsTheNumberAndTheContent) {
 }
 
 TEST(StateFile, IsNotTakenForANumberWhenItHoldsSomethingElse) {
-    for (const char* const content : {"", "12", "12 \n", "x\n", "-1\n", "1 g\n", "1 2 3\n",
-                                      "1 11112222333344445\n", "99999999999999999999\n"}) {
+    for (const char* const content :
+         {"", "12", "12 \n", "x\n", "-1\n", "1 g\n", "1 2 3\n", "1 11112222333344445\n",
+          "2147483648\n", "99999999999999999999\n"}) {
         expectBadInput(content);
     }
 }
