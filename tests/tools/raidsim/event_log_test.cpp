@@ -96,6 +96,15 @@ TEST(EventLog, OldestEventGivesWayWhenFull) {
     EXPECT_THAT(numbersIn(log.body(0, 100)), ElementsAre(3, 4, 5));
 }
 
+TEST(EventLog, KeepsWhatWasAddedLastWhereverItIsListed) {
+    EventLog log(3);
+    appendMany(log, 3);
+    log.insert({{"sequenceNumber", "20"}}, {EventPlace::Kind::first});
+    EXPECT_THAT(numbersIn(log.body(0, 100)), ElementsAre(20, 2, 3));
+    log.append({});
+    EXPECT_THAT(numbersIn(log.body(0, 100)), ElementsAre(20, 3, 21));
+}
+
 TEST(EventLog, WaitForAnEventThatIsThereEndsAtOnceWithTheFirstNewer) {
     EventLog log;
     appendMany(log, 3);

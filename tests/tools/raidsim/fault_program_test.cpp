@@ -113,6 +113,24 @@ TEST_F(MisbehavingProgram, RefusesConnectionsUntilItIsToldToStop) {
     EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
 }
 
+TEST_F(MisbehavingProgram, ChangesNothingWhileAnotherHasItsPort) {
+    start({"--fault", "refuse.fault"});
+    {
+        Program other({"--port", std::to_string(port), "system.xml"});
+        EXPECT_THAT(other.readLine(), StartsWith("raidsim: listening"));
+        for (const std::string command : {"fault off", "fault cut.fault"}) {
+            type(command);
+            EXPECT_EQ(program->readErrorLine(), "raidsim: fault: bind: Address already in use");
+        }
+        other.type("quit\n");
+        EXPECT_EQ(other.exitStatus(), 0);
+    }
+    EXPECT_THROW((void)ask(port, getConfig), boost::system::system_error);
+    type("fault off");
+    EXPECT_EQ(line(), "fault: off");
+    EXPECT_THAT(ask(port, getConfig), StartsWith("HTTP/1.1 200 OK\n"));
+}
+
 TEST_F(MisbehavingProgram, SaysWhyACaseCannotBePlayed) {
     start({"--fault", "unfit.fault"});
     EXPECT_EQ(ask(port, getConfig), "");

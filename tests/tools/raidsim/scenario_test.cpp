@@ -288,6 +288,8 @@ TEST(RealTime, PassesSoManyTimesAsFast) {
     EXPECT_EQ(realTime(1500ms, 1), 1500ms);
     EXPECT_EQ(realTime(1h, 60), 1min);
     EXPECT_EQ(realTime(1'000'000s, 0.001), 1'000'000'000s);
+    EXPECT_EQ(realTime(13243ms, 0.64), 20'692'187us);
+    EXPECT_EQ(realTime(86843ms, 3.2), 27'138'437us);
 }
 
 TEST(RealTime, IsOneThatTheClockCanCountHoweverLateTheStepIs) {

@@ -6,9 +6,10 @@
 namespace raidsim {
 
 std::chrono::steady_clock::duration realTime(std::chrono::milliseconds shown, double speed) {
-    using Milliseconds = std::chrono::duration<double, std::milli>;
+    using Milliseconds = std::chrono::duration<long double, std::milli>;
     constexpr std::chrono::years never{100};
-    // What is finer than that depends on the registers of the machine.
+    // A long double has the same digits in both widths, a double more of them in 32 bits. Finer
+    // than a microsecond is only what a speed such as 0.001 is off itself.
     return std::chrono::round<std::chrono::microseconds>(
         std::min(Milliseconds(shown) / speed, Milliseconds(never)));
 }

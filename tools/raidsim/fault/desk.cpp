@@ -7,65 +7,74 @@ namespace raidsim {
 void FaultDesk::arm(std::shared_ptr<const FaultFile> file, std::optional<std::size_t> only) {
     if (only)
         (void)file->at(*only);
-    armed = std::move(file);
-    current = only.value_or(0);
-    end = only ? *only + 1 : armed->cases();
-    prepare();
-    changed();
+    Reel fresh;
+    fresh.current = only.value_or(0);
+    fresh.end = only ? *only + 1 : file->cases();
+    fresh.file = std::move(file);
+    prepare(fresh);
+    change(std::move(fresh));
 }
 
 void FaultDesk::off() {
-    armed.reset();
-    next.reset();
+    change({});
     ++offs;
-    changed();
 }
 
-void FaultDesk::prepare() {
-    next.reset();
-    if (!armed)
+void FaultDesk::change(Reel to) {
+    std::swap(reel, to);
+    try {
+        changed();
+    } catch (...) {
+        std::swap(reel, to);
+        throw;
+    }
+}
+
+void FaultDesk::prepare(Reel& reel) {
+    reel.next.reset();
+    if (!reel.file)
         return;
-    if (current == end) {
-        armed.reset();
+    if (reel.current == reel.end) {
+        reel.file.reset();
         return;
     }
-    auto chosen = armed->at(current);
-    std::string label = currentName();
+    auto chosen = reel.file->at(reel.current);
+    std::string label = currentName(reel);
     if (!chosen.values.empty())
         label += ": " + chosen.values;
-    next = Play{std::move(chosen), std::move(label)};
+    reel.next = Play{std::move(chosen), std::move(label)};
 }
 
 void FaultDesk::prepareOrComplain() {
     try {
-        prepare();
+        prepare(reel);
     } catch (const FaultError& error) {
-        complain("fault: " + currentName() + " cannot be played: " + error.what());
-        armed.reset();
+        complain("fault: " + currentName(reel) + " cannot be played: " + error.what());
+        reel.file.reset();
     }
 }
 
-std::string FaultDesk::currentName() const {
-    return armed->name() + " case " + std::to_string(current);
+std::string FaultDesk::currentName(const Reel& reel) {
+    return reel.file->name() + " case " + std::to_string(reel.current);
 }
 
 std::optional<FaultDesk::Play> FaultDesk::take() {
-    auto taken = std::exchange(next, std::nullopt);
-    ++current;
+    auto taken = std::exchange(reel.next, std::nullopt);
+    ++reel.current;
     prepareOrComplain();
     changed();
     return taken;
 }
 
 std::optional<FaultDesk::Play> FaultDesk::meetConnection() {
-    if (!next || next->chosen.refuses || next->chosen.beginsWithRequest())
+    if (!reel.next || reel.next->chosen.refuses || reel.next->chosen.beginsWithRequest())
         return std::nullopt;
     return take();
 }
 
 std::optional<FaultDesk::Play> FaultDesk::meetRequest(RequestKind kind) {
-    if (!next || !next->chosen.beginsWithRequest() ||
-        (next->chosen.meets != RequestKind::any && next->chosen.meets != kind))
+    if (!reel.next || !reel.next->chosen.beginsWithRequest() ||
+        (reel.next->chosen.meets != RequestKind::any && reel.next->chosen.meets != kind))
         return std::nullopt;
     return take();
 }

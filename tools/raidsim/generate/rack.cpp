@@ -1,6 +1,7 @@
 #include "generate/rack.h"
 
 #include <algorithm>
+#include <optional>
 #include <utility>
 
 #include "generate/element.h"
@@ -201,16 +202,16 @@ void addMembers(Element& array, const AdapterPlan& adapter, const ArrayPlan& pla
     Element physical("o:PhysicalDrives");
     physical.number("overallStatus", normal);
     for (const ChannelPlan& channel : adapter.channels) {
-        Element listed = channelFields(adapter, channel);
-        bool any = false;
+        std::optional<Element> listed;
         for (const DrivePlan& each : channel.drives) {
             if (!contains(plan, channel.id, each.device))
                 continue;
-            listed.child("ac:hardDrive", member(adapter, channel, each));
-            any = true;
+            if (!listed)
+                listed = channelFields(adapter, channel);
+            listed->child("ac:hardDrive", member(adapter, channel, each));
         }
-        if (any)
-            physical.child("ac:channel", std::move(listed));
+        if (listed)
+            physical.child("ac:channel", *std::move(listed));
     }
     array.child("ac:physicalDrives", std::move(physical));
 }
@@ -337,7 +338,7 @@ xml::Tree document(const SystemPlan& plan) {
         system.child("ac:adapter", adapter(each));
     xml::Tree content;
     xml::addChild(content, "ac:system").swap(system.get());
-    return soap::envelope("m:getConfigResponse", content);
+    return soap::envelope("m:getConfigResponse", std::move(content));
 }
 
 }  // namespace raidsim::generate

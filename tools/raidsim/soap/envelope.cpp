@@ -19,19 +19,19 @@ constexpr std::array<std::pair<const char*, const char*>, 7> namespaces{{
 
 }  // namespace
 
-xml::Tree envelope(const std::string& response, const xml::Tree& content) {
+xml::Tree envelope(const std::string& response, xml::Tree&& content) {
     xml::Tree document;
     xml::Tree& outer = xml::addChild(document, "env:Envelope");
     for (const auto& [name, uri] : namespaces)
         xml::addAttribute(outer, name, uri);
-    xml::addChild(xml::addChild(outer, "env:Body"), response, content);
+    xml::addChild(xml::addChild(outer, "env:Body"), response).swap(content);
     return document;
 }
 
 std::string returnValueBody(const std::string& response, int value) {
     xml::Tree content;
     xml::addText(content, "as:return", "xsd:int", std::to_string(value));
-    return xml::format(envelope(response, content));
+    return xml::format(envelope(response, std::move(content)));
 }
 
 std::string faultBody(Blame blame, const std::string& reason) {
@@ -45,7 +45,7 @@ std::string faultBody(Blame blame, const std::string& reason) {
     xml::Tree fault;
     xml::addChild(fault, "env:Code", code);
     xml::addChild(fault, "env:Reason", reasons);
-    return xml::format(envelope("env:Fault", fault));
+    return xml::format(envelope("env:Fault", std::move(fault)));
 }
 
 }  // namespace raidsim::soap

@@ -30,7 +30,7 @@ TreeType* systemOf(TreeType& document) {
 xml::Tree parseAnswer(std::string_view text) {
     xml::Tree tree = xml::parse(text);
     if (xml::childOf(tree, root) != nullptr)
-        tree = soap::envelope(response, tree);
+        tree = soap::envelope(response, std::move(tree));
     if (systemOf(tree) == nullptr)
         throw xml::XmlError("there is no ac:system element, bare or in a getConfig answer");
     return tree;

@@ -61,7 +61,8 @@ std::optional<EventAnswer> cutEventAnswer(const std::string& body) {
 EventFrame ownEventFrame() {
     xml::Tree content;
     xml::addChild(content, listElement, xml::element("o:Events"));
-    const std::string empty = xml::format(soap::envelope("m:getEventsResponse", content));
+    const std::string empty =
+        xml::format(soap::envelope("m:getEventsResponse", std::move(content)));
     const auto end = empty.rfind(std::string("</") + listElement);
     return {empty.substr(0, end), "\n      " + empty.substr(end), empty};
 }

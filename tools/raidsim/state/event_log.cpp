@@ -201,9 +201,10 @@ int EventLog::add(const Entries::const_iterator& position, Entry entry) {
     const int number = entry.event.sequenceNumber;
     frame = entry.frame;
     last = position == events.end() ? number : std::max(last, number);
+    entry.added = everAdded++;
     events.insert(position, std::move(entry));
     if (events.size() > capacity)
-        events.pop_front();
+        events.erase(std::ranges::min_element(events, {}, &Entry::added));
     release(number);
     return number;
 }

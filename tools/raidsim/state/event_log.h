@@ -47,9 +47,10 @@ public:
     // The same for an event that is given no place; throws, too, for a sequenceNumber below 1.
     static void checkWithoutPlace(const Fields& fields);
 
-    // Adds an event and calls the waiters whose wait it ends; the oldest event gives way when
-    // the log is full. Returns the event's sequence number. Throws as checkWithoutPlace does, and
-    // when a given sequenceNumber is not above the newest.
+    // Adds an event and calls the waiters whose wait it ends; the event that was added
+    // first gives way when the log is full, wherever it is listed. Returns the event's sequence
+    // number. Throws as checkWithoutPlace does, and when a given sequenceNumber is not above the
+    // newest.
     int append(const Fields& fields);
 
     // The same at any place, and with any number. Throws as check does, and when there is no such
@@ -89,6 +90,7 @@ private:
     struct Entry {
         ListedEvent event;
         Frame frame;
+        std::uint64_t added = 0;  // how many were added before it
     };
     struct Wait {
         int lastRetrieved;
@@ -106,6 +108,7 @@ private:
     Entries events;
     Frame frame = ownFrame();  // that of the newest event
     int last = 0;
+    std::uint64_t everAdded = 0;
     std::map<Ticket, Wait> waiters;
     Ticket nextTicket = 1;
 };
