@@ -77,6 +77,7 @@ class RAIDInstrumentation:
     def inventory(self, *, timeout: float | None = PATIENCE) -> Inventory:
         """The inventory that was read last; reads it if there is none yet, as refresh does."""
         _check(timeout)
+        self._check_open()
         return self._inventory or self.refresh(timeout=timeout)
 
     def refresh(self, *, timeout: float | None = PATIENCE) -> Inventory:
@@ -125,9 +126,12 @@ class RAIDInstrumentation:
             stream.cancel()
         return stream
 
-    def _result(self, call: Call[Result], timeout: float | None) -> Result:
+    def _check_open(self) -> None:
         if self._is_closed:
             raise RuntimeError("the RAIDInstrumentation is closed")
+
+    def _result(self, call: Call[Result], timeout: float | None) -> Result:
+        self._check_open()
         try:
             return call.result(timeout)
         except TimeoutError:

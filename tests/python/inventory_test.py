@@ -249,9 +249,11 @@ def test_ctrl_c_ends_a_refresh(raid: RAIDInstrumentation) -> None:
                 raid.refresh()
 
 
-def test_nothing_is_asked_after_the_end_of_the_block() -> None:
-    with RAIDInstrumentation() as raid:
-        pass
+def test_nothing_is_answered_after_the_end_of_the_block() -> None:
+    with Simulator("small-server.xml"), RAIDInstrumentation() as raid:
+        raid.inventory()
+    with pytest.raises(RuntimeError, match="closed"):
+        raid.inventory()
     with pytest.raises(RuntimeError, match="closed"):
         raid.refresh()
     with pytest.raises(RuntimeError, match="closed"):
