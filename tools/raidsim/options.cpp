@@ -155,8 +155,7 @@ void checkAlone(const CLI::App& app, const CLI::App& subcommand) {
     }
 }
 
-// The document is made in memory, and a drive of its own channel takes 70 kilobytes there: more do
-// not fit into the 32-bit program.
+// The document is made in memory, where so many take up to 2.7 gigabytes of the 32-bit program.
 void checkSize(const CLI::App& command, const generate::Order& order) {
     constexpr double most = 50'000;
     const generate::RackSize& rack = order.rack;
