@@ -47,7 +47,7 @@ constexpr const char* footer =
     "read, 69 cannot listen, 70 internal error, 74 the output cannot be written.";
 
 constexpr const char* generateFooter =
-    "Numbers are 0 to 100000.\n"
+    "Numbers are 0 to 100000, with 50000 adapters, channels and drives in all at most.\n"
     "Examples:\n"
     "  raidsim generate >server.xml\n"
     "      one adapter with a channel of twelve drives\n"
